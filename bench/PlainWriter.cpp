@@ -1,0 +1,175 @@
+#include "bench/PlainWriter.h"
+
+#include <charconv>
+#include <cstring>
+
+#include <fcntl.h>
+#include <unistd.h>
+
+namespace DrawmereNS {
+namespace {
+
+constexpr std::size_t bufferSize = std::size_t{1} << 20U;
+constexpr std::size_t maxNumber = 64; // a float has 39 digits before the point
+constexpr int decimals = 3;
+
+char* dropTrailingZeros(char* end) {
+    while (end[-1] == '0') {
+        --end;
+    }
+    return end[-1] == '.' ? end - 1 : end;
+}
+
+} // namespace
+
+PlainWriter::PlainWriter(const std::string& path)
+    : file(open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0644)), failed(file < 0),
+      buffer(new char[bufferSize]), cursor(buffer.get()) {
+    append("<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n");
+}
+
+PlainWriter::~PlainWriter() {
+    if (file >= 0) {
+        close(file);
+    }
+}
+
+void PlainWriter::startPage(float width, float height) {
+    startElement("svg");
+    addText("xmlns", "http://www.w3.org/2000/svg");
+    addNumber("width", width);
+    addNumber("height", height);
+    append(">");
+}
+
+std::size_t PlainWriter::finish() {
+    append("</svg>\n");
+    flush();
+    failed = close(file) != 0 || failed;
+    file = -1;
+    return failed ? 0 : flushed;
+}
+
+void PlainWriter::restore() {
+    state = saved.back();
+    saved.pop_back();
+}
+
+void PlainWriter::translate(float x, float y) {
+    state.shiftX += x;
+    state.shiftY += y;
+}
+
+void PlainWriter::drawRect(float x, float y, float width, float height, Paint paint) {
+    startElement("rect");
+    addNumber("x", x + state.shiftX);
+    addNumber("y", y + state.shiftY);
+    addNumber("width", width);
+    addNumber("height", height);
+    addPaint(paint);
+    endEmptyElement();
+}
+
+void PlainWriter::drawCircle(float cx, float cy, float r, Paint paint) {
+    startElement("circle");
+    addNumber("cx", cx + state.shiftX);
+    addNumber("cy", cy + state.shiftY);
+    addNumber("r", r);
+    addPaint(paint);
+    endEmptyElement();
+}
+
+void PlainWriter::drawLine(float x1, float y1, float x2, float y2) {
+    startElement("line");
+    addNumber("x1", x1 + state.shiftX);
+    addNumber("y1", y1 + state.shiftY);
+    addNumber("x2", x2 + state.shiftX);
+    addNumber("y2", y2 + state.shiftY);
+    addPaint({.fill = false, .stroke = true});
+    endEmptyElement();
+}
+
+void PlainWriter::startElement(std::string_view name) {
+    append("<");
+    append(name);
+}
+
+void PlainWriter::addNumber(std::string_view name, float value) {
+    startAttribute(name);
+    appendNumber(value);
+    append("\"");
+}
+
+void PlainWriter::addColor(std::string_view name, std::uint32_t rgb) {
+    constexpr std::string_view digits = "0123456789abcdef";
+    char text[] = "#rrggbb";
+    for (int i = 6; i > 0; --i) {
+        text[i] = digits[rgb & 0xFU];
+        rgb >>= 4U;
+    }
+    addText(name, text);
+}
+
+void PlainWriter::addText(std::string_view name, std::string_view value) {
+    startAttribute(name);
+    append(value);
+    append("\"");
+}
+
+void PlainWriter::startGroup(const Matrix& matrix) {
+    startElement("g");
+    startAttribute("transform");
+    append("matrix(");
+    const float numbers[] = {matrix.a, matrix.b, matrix.c, matrix.d, matrix.e, matrix.f};
+    for (const float& number : numbers) {
+        appendNumber(number);
+        append(&number == &numbers[5] ? ")" : ",");
+    }
+    append("\">");
+}
+
+void PlainWriter::addPaint(Paint paint) {
+    if (paint.fill) {
+        addColor("fill", state.fillColor);
+    } else {
+        addText("fill", "none");
+    }
+    if (paint.stroke) {
+        addColor("stroke", state.strokeColor);
+        addNumber("stroke-width", state.strokeWidth);
+    }
+}
+
+void PlainWriter::startAttribute(std::string_view name) {
+    append(" ");
+    append(name);
+    append("=\"");
+}
+
+void PlainWriter::append(std::string_view bytes) {
+    std::memcpy(room(bytes.size()), bytes.data(), bytes.size());
+    cursor += bytes.size();
+}
+
+void PlainWriter::appendNumber(float value) {
+    char* begin = room(maxNumber);
+    const auto end =
+        std::to_chars(begin, begin + maxNumber, value, std::chars_format::fixed, decimals).ptr;
+    cursor = dropTrailingZeros(end);
+}
+
+char* PlainWriter::room(std::size_t count) {
+    if (count > static_cast<std::size_t>(buffer.get() + bufferSize - cursor)) {
+        flush();
+    }
+    return cursor;
+}
+
+void PlainWriter::flush() {
+    const auto count = static_cast<std::size_t>(cursor - buffer.get());
+    failed = write(file, buffer.get(), count) != static_cast<ssize_t>(count) || failed;
+    flushed += count;
+    cursor = buffer.get();
+}
+
+} // namespace DrawmereNS

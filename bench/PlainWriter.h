@@ -1,0 +1,99 @@
+/// The yardstick of the benches: SVG written straight into a buffer, without a tree.
+#pragma once
+
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace DrawmereNS {
+
+/// Writes each element as it is drawn, with all its own attributes and absolute coordinates: what a
+/// program does that prints SVG by itself and cares for speed. Numbers have three decimals at most,
+/// colours six digits. Lengths are points. Nothing is checked but the writing itself.
+class PlainWriter {
+public:
+    /// How a shape is painted.
+    struct Paint {
+        bool fill;
+        bool stroke;
+    };
+
+    /// The six numbers of a matrix as SVG 1.1 orders them.
+    struct Matrix {
+        float a;
+        float b;
+        float c;
+        float d;
+        float e;
+        float f;
+    };
+
+    /// Makes the file `path` and begins a document.
+    explicit PlainWriter(const std::string& path);
+    PlainWriter(const PlainWriter&) = delete;
+    PlainWriter& operator=(const PlainWriter&) = delete;
+    ~PlainWriter();
+
+    /// Writes the root's start tag for a page of this size.
+    void startPage(float width, float height);
+
+    /// Ends the document and writes what is left. Returns: the bytes of the file, 0 when it could
+    /// not be written.
+    std::size_t finish();
+
+    // The graphic state; a translation moves the coordinates of later shapes.
+    void save() { saved.push_back(state); }
+
+    void restore();
+    void translate(float x, float y);
+
+    void setFillColor(std::uint32_t rgb) { state.fillColor = rgb; }
+
+    void setStrokeColor(std::uint32_t rgb) { state.strokeColor = rgb; }
+
+    void setStrokeWidth(float width) { state.strokeWidth = width; }
+
+    void drawRect(float x, float y, float width, float height, Paint paint);
+    void drawCircle(float cx, float cy, float r, Paint paint);
+    void drawLine(float x1, float y1, float x2, float y2);
+
+    // Markup as it stands: an element is started, gets its attributes, and is ended.
+    void startElement(std::string_view name);
+    void addNumber(std::string_view name, float value);
+    void addColor(std::string_view name, std::uint32_t rgb);
+    void addText(std::string_view name, std::string_view value);
+
+    void endEmptyElement() { append("/>"); }
+
+    void startGroup(const Matrix& matrix);
+
+    void endGroup() { append("</g>"); }
+
+private:
+    struct State {
+        float shiftX = 0.0F;
+        float shiftY = 0.0F;
+        float strokeWidth = 1.0F;
+        std::uint32_t fillColor = 0;
+        std::uint32_t strokeColor = 0;
+    };
+
+    void append(std::string_view bytes);
+    void appendNumber(float value);
+    void startAttribute(std::string_view name);
+    void addPaint(Paint paint);
+    char* room(std::size_t count);
+    void flush();
+
+    int file;
+    bool failed = false;
+    std::size_t flushed = 0;
+    State state;
+    std::vector<State> saved;
+    std::unique_ptr<char[]> buffer;
+    char* cursor;
+};
+
+} // namespace DrawmereNS

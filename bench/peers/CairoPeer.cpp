@@ -1,0 +1,57 @@
+#include "bench/peers/CairoPeer.h"
+
+#include <cairo-svg.h>
+
+namespace DrawmereNS {
+namespace {
+
+double wide(float number) { return static_cast<double>(number); }
+
+double channel(std::uint32_t rgb, unsigned int shift) {
+    return static_cast<double>(rgb >> shift & 0xFFU) / 255.0;
+}
+
+} // namespace
+
+CairoPeer::CairoPeer(const std::string& path, float width, float height)
+    : surface(cairo_svg_surface_create(path.c_str(), wide(width), wide(height))),
+      context(cairo_create(surface)) {}
+
+CairoPeer::~CairoPeer() {
+    cairo_destroy(context);
+    cairo_surface_destroy(surface);
+}
+
+void CairoPeer::translate(float x, float y) { cairo_translate(context, wide(x), wide(y)); }
+
+void CairoPeer::setStrokeWidth(float width) { cairo_set_line_width(context, wide(width)); }
+
+void CairoPeer::strokeRect(float x, float y, float width, float height) {
+    addRect(x, y, width, height);
+    setSource(strokeColor);
+    cairo_stroke(context);
+}
+
+void CairoPeer::fillAndStrokeRect(float x, float y, float width, float height) {
+    addRect(x, y, width, height);
+    setSource(fillColor);
+    cairo_fill_preserve(context);
+    setSource(strokeColor);
+    cairo_stroke(context);
+}
+
+bool CairoPeer::finish() {
+    const bool drawn = cairo_status(context) == CAIRO_STATUS_SUCCESS;
+    cairo_surface_finish(surface);
+    return drawn && cairo_surface_status(surface) == CAIRO_STATUS_SUCCESS;
+}
+
+void CairoPeer::setSource(std::uint32_t rgb) {
+    cairo_set_source_rgb(context, channel(rgb, 16), channel(rgb, 8), channel(rgb, 0));
+}
+
+void CairoPeer::addRect(float x, float y, float width, float height) {
+    cairo_rectangle(context, wide(x), wide(y), wide(width), wide(height));
+}
+
+} // namespace DrawmereNS

@@ -1,0 +1,29 @@
+# Examples are programs as a caller writes them: they know the shared library alone.
+
+if(DRAWMERE_TESTS)
+    find_program(XMLLINT xmllint REQUIRED)
+endif()
+
+# drawmere_add_example(<name>) builds <name>.cpp. The example writes into its working directory;
+# tests run it, then ask whether what it wrote is well-formed and valid SVG 1.1.
+function(drawmere_add_example name)
+    add_executable(${name} ${name}.cpp)
+    target_link_libraries(${name} PRIVATE drawmere drawmere_flags)
+    if(NOT DRAWMERE_TESTS)
+        return()
+    endif()
+    set(written ${CMAKE_CURRENT_BINARY_DIR}/out/${name})
+    file(MAKE_DIRECTORY ${written})
+    add_test(NAME examples.${name} COMMAND ${name} WORKING_DIRECTORY ${written})
+    set_tests_properties(examples.${name} PROPERTIES FIXTURES_SETUP ${name} TIMEOUT 120)
+    drawmere_lint_example(${name} wellformed --noout)
+    drawmere_lint_example(${name} valid --noout --dtdvalidfpi "-//W3C//DTD SVG 1.1//EN")
+endfunction()
+
+function(drawmere_lint_example name claim)
+    add_test(NAME examples.${name}.${claim}
+        COMMAND bash -c "\"$0\" --nonet \"$@\" *.svg" ${XMLLINT} ${ARGN}
+        WORKING_DIRECTORY ${CMAKE_CURRENT_BINARY_DIR}/out/${name}
+    )
+    set_tests_properties(examples.${name}.${claim} PROPERTIES FIXTURES_REQUIRED ${name})
+endfunction()

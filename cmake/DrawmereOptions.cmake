@@ -1,0 +1,35 @@
+# What can be chosen, and what is looked for on the machine.
+
+option(DRAWMERE_WERROR "Treat warnings as errors" OFF)
+option(DRAWMERE_TESTS "Build the tests" ${PROJECT_IS_TOP_LEVEL})
+option(DRAWMERE_EXAMPLES "Build the examples" ${PROJECT_IS_TOP_LEVEL})
+option(DRAWMERE_BENCHES "Build the benchmarks" ${PROJECT_IS_TOP_LEVEL})
+option(DRAWMERE_FUZZ "Build the fuzz targets (clang with libFuzzer)" OFF)
+option(DRAWMERE_LTO "Optimise across sources when the compiler can" OFF)
+set(DRAWMERE_SANITIZE "" CACHE STRING "Sanitizers of the whole build, as -fsanitize takes them")
+
+if(NOT CMAKE_BUILD_TYPE AND NOT CMAKE_CONFIGURATION_TYPES)
+    set(CMAKE_BUILD_TYPE RelWithDebInfo CACHE STRING "Kind of build" FORCE)
+endif()
+
+set(CMAKE_CXX_STANDARD 20)
+set(CMAKE_CXX_STANDARD_REQUIRED ON)
+set(CMAKE_CXX_EXTENSIONS OFF)
+
+find_program(CCACHE ccache)
+if(CCACHE AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
+    # Without these words a source that uses a precompiled header never hits the cache.
+    set(CMAKE_CXX_COMPILER_LAUNCHER env CCACHE_SLOPPINESS=pch_defines,time_macros ${CCACHE})
+endif()
+
+find_package(PkgConfig REQUIRED)
+find_package(ICU REQUIRED COMPONENTS uc i18n)
+find_package(Threads REQUIRED)
+find_package(ZLIB REQUIRED)
+pkg_check_modules(URIPARSER REQUIRED IMPORTED_TARGET liburiparser)
+
+if(DRAWMERE_LTO)
+    include(CheckIPOSupported)
+    check_ipo_supported(RESULT DRAWMERE_LTO_WORKS LANGUAGES CXX)
+    set(CMAKE_INTERPROCEDURAL_OPTIMIZATION ${DRAWMERE_LTO_WORKS})
+endif()

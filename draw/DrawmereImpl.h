@@ -1,0 +1,213 @@
+/// The drawing of one document: one element for each call.
+#pragma once
+
+#include "DrawmereErrHandler.h"
+#include "DrawmereTypes.h"
+#include "SVGMatrix.h"
+#include "foundation/common/MoxLength.h"
+#include "foundation/common/MoxPointT.h"
+#include "foundation/common/MoxRectT.h"
+#include "images/SVGGraphicManager.h"
+#include "tree/SVGDocument.h"
+
+#include <iosfwd>
+#include <vector>
+
+namespace TalFont {
+class TLStringWithGlyphInfo;
+}
+
+namespace TalGraphic {
+class TLGraphicImage;
+}
+
+namespace DrawmereNS {
+
+class SVGConfig;
+class SVGFontManager;
+class SVGGraphicContext;
+class SVGGroupManager;
+struct GraphicContext;
+class SVGRefIDManager;
+class SVGTreeManager;
+
+using MoxCommonNS::MoxColor;
+using MoxCommonNS::MoxLength;
+using MoxCommonNS::MoxPointT;
+using MoxCommonNS::MoxRectT;
+using MoxCommonNS::MoxUnitType;
+using TalFont::TLStringWithGlyphInfo;
+using TalGraphic::TLGraphicImage;
+
+/// What stands behind the public class: owns the managers of one document, makes an element for
+/// each drawing call, and hands it to the open group or to the tree. The output profiles derive
+/// from it and change its virtual operations alone. All coordinates are lengths, written in points.
+class DRAWMERE_API DrawmereImpl {
+public:
+    /// Borrows: `config`, for its own life.
+    explicit DrawmereImpl(SVGConfig* config);
+    DrawmereImpl(const DrawmereImpl&) = delete;
+    DrawmereImpl& operator=(const DrawmereImpl&) = delete;
+    virtual ~DrawmereImpl();
+
+    /// Names a rectangle of the document as a link destination. Units: as they stand, no lengths.
+    virtual void setInternalView(UnicodeString id, float x, float y, float width, float height);
+
+    /// Names a point of the document as a link destination. Units: as they stand, no lengths.
+    virtual void setInternalLinkAnchor(UnicodeString id, float x, float y);
+
+    /// Does nothing: failures of drawing are thrown.
+    virtual void setErrorHandler(const DrawmereErrHandler* handler);
+
+    /// Writes `document` for a caller outside the library. `saveOptions`: as `MoxDocument::save`.
+    virtual void outputStream(MoxDocument* document, const UnicodeString& encoding,
+                              std::ostream* stream, const UnicodeString& saveOptions);
+
+    /// Closes the open group and saves the state; a type other than the plain one starts from the
+    /// defaults and moves the cursor of the tree.
+    virtual void pushState(ELEMENT_TYPE type);
+
+    /// Closes the open group and takes the saved state back.
+    /// Throws: MoxError 16406 with nothing saved, 16407 when another type was pushed last.
+    virtual void popState(ELEMENT_TYPE type);
+
+    /// Stores a number with the state; no coordinate depends on it.
+    virtual void setScale(float scale);
+
+    /// Sets `width`, `height` and `viewBox` of the root, the first two with the unit "pt".
+    virtual void setCanvasSize(MoxLength width, MoxLength height);
+
+    /// The same with `width` and `height` in `unit`; a unit outside 6 to 10 writes plain numbers.
+    virtual void setCanvasSize(MoxLength width, MoxLength height, MoxUnitType unit);
+
+    /// Adds an elliptical arc to the open path. Units: points, `angle` in degrees.
+    virtual void ellipticalArcTo(float rx, float ry, float angle, bool largeArc, bool sweep,
+                                 float x, float y, bool absolute);
+
+    /// Adds a closing command to the open path.
+    virtual void closePath(bool absolute);
+
+    /// Opens a clip path; what is drawn until `endClipDef` becomes its content.
+    virtual void startClipDef(UNITSTYPE units);
+    /// The same, for a clip that every profile can show.
+    virtual void startClipRect(UNITSTYPE units);
+    virtual void endClipDef();
+    /// Clips what follows by the last clip path.
+    virtual void doClip();
+
+    /// Draws a rectangle; `rx` and `ry` round its corners unless both are 0.
+    virtual void drawRect(MoxLength x, MoxLength y, MoxLength width, MoxLength height, MoxLength rx,
+                          MoxLength ry, PAINTMODE mode);
+    virtual void drawCircle(MoxLength cx, MoxLength cy, MoxLength r, PAINTMODE mode);
+    virtual void drawEllipse(MoxLength cx, MoxLength cy, MoxLength rx, MoxLength ry,
+                             PAINTMODE mode);
+    virtual void drawLine(MoxLength x1, MoxLength y1, MoxLength x2, MoxLength y2, PAINTMODE mode);
+
+    /// Draws a polyline when `open` is set, otherwise a polygon.
+    /// Shape: `coordinates[count]`, x and y in turn; the last of an odd count is dropped.
+    /// Units: points. Borrows: `coordinates`, for the call.
+    virtual void drawPoly(float* coordinates, int count, bool open, PAINTMODE mode);
+
+    /// Draws a run of text at one position.
+    virtual void drawText(const UnicodeString& text, const MoxLength& x, const MoxLength& y,
+                          PAINTMODE mode, TLStringWithGlyphInfo* glyphs, bool wholeRun,
+                          bool leftToRight);
+    /// Draws a run of text at one position or at one for each character.
+    virtual void drawText(const UnicodeString& text, const std::vector<MoxLength>& x,
+                          const std::vector<MoxLength>& y, const std::vector<float>& rotation,
+                          PAINTMODE mode, TLStringWithGlyphInfo* glyphs, bool wholeRun,
+                          bool leftToRight);
+
+    /// Places an image. Borrows: `image`, for the call.
+    virtual void drawImage(TLGraphicImage* image, const MoxLength& width, const MoxLength& height,
+                           const MoxLength& x, const MoxLength& y);
+    /// Copies an image to where the configuration says. Returns: the path of the copy.
+    virtual UnicodeString copyImage(TLGraphicImage* image);
+
+    /// Opens a link to `href`; what is drawn until `endLink` leads there. The name with the number
+    /// 1073 as `show` asks for a new window.
+    virtual void startLink(const UnicodeString& href, const MoxName& show);
+    virtual void endLink();
+
+    /// Opens a mask. Returns: its id.
+    virtual UnicodeString startMask(MoxLength x, MoxLength y, MoxLength width, MoxLength height,
+                                    UNITSTYPE maskUnits, UNITSTYPE contentUnits);
+    virtual void endMask();
+
+    /// Opens a gradient, whose stops follow. Returns: its id.
+    virtual UnicodeString startLinearGradient(MoxLength x1, MoxLength y1, MoxLength x2,
+                                              MoxLength y2, SVGMatrix matrix, UNITSTYPE units,
+                                              GRADSPERADMOD spread);
+    virtual UnicodeString startRadialGradient(MoxLength cx, MoxLength cy, MoxLength r, MoxLength fx,
+                                              MoxLength fy, SVGMatrix matrix, UNITSTYPE units,
+                                              GRADSPERADMOD spread);
+    virtual void endGradiant(); // sic
+    virtual void setStopColor(const MoxColor& color, float offset, float opacity);
+
+    /// Opens a pattern, whose content follows. Returns: its id.
+    virtual UnicodeString startPattern(const MoxRectT<MoxLength>& area,
+                                       const MoxRectT<MoxLength>& viewArea, SVGMatrix matrix,
+                                       UNITSTYPE patternUnits, UNITSTYPE contentUnits);
+    virtual void endPattern();
+
+    /// Sends an element where it belongs: page content to the open group, and with `direct`, as
+    /// containers need it, to the cursor of the tree, which moves into it with `makeCurrent`.
+    virtual void addElement(SVGElement* element, bool direct, bool makeCurrent);
+
+    /// Makes the root element.
+    void initDOM(const UnicodeString& version);
+    /// Begins the document.
+    void initRootSvg();
+    /// Completes the tree; the document can be saved afterwards.
+    void finishRootSvg();
+
+    /// Returns: the document, borrowed; it lives on in any `MoxPtr` that takes it.
+    SVGDocument* getDocument() const;
+    /// Returns: the state that setters change now, borrowed; while a path is open that is a state
+    /// of the path's own, which is thrown away with it.
+    SVGGraphicContext* getGContext() const;
+
+    /// Writes `fill`, `stroke` and `fill-rule` as `mode` and the state ask for, and leaves out what
+    /// the root says already.
+    void setPaintAttr(SVGElement* element, PAINTMODE mode);
+
+    void startPathData();
+    void endPathData(PAINTMODE mode);
+    void setPathMoveTo(const MoxPointT<MoxLength>& point);
+    void setPathClosepath();
+    void setPathLineTo(const MoxPointT<MoxLength>& point);
+    void setPathCubicBezierCurveTo(const MoxPointT<MoxLength>& point1,
+                                   const MoxPointT<MoxLength>& point2,
+                                   const MoxPointT<MoxLength>& point3);
+    void setPathQuadraticBezierCurveTo(const MoxPointT<MoxLength>& point1,
+                                       const MoxPointT<MoxLength>& point2);
+
+    /// Places an empty `desc` in the root, behind the `defs` when there is one.
+    void setComment();
+
+    /// Returns: the attribute of the nearest element that has it, from `element` upwards, or the
+    /// null value; with `stopAtRoot` no element above an `svg` is asked.
+    MoxValue getInheritAttribute(const MoxElement* element, const MoxName& name,
+                                 bool stopAtRoot) const;
+
+    SVGGroupManager* groupManager = nullptr;      // owned
+    SVGTreeManager* treeManager = nullptr;        // owned
+    SVGGroupManager* savedGroupManager = nullptr; // owned, while a path is open
+    SVGRefIDManager* refIdManager = nullptr;      // owned
+    UnicodeString clipPathId;
+    bool inClipDef = false;
+    PAINTMODE lastPathPaintMode = PAINTMODE_FILL;
+    SVGGraphicManager graphicManager;
+    SVGFontManager* fontManager = nullptr; // owned
+    SVGConfig* config;                     // borrowed
+
+protected:
+    MoxPtr<SVGElement> createElement(SVGName name) const;
+
+private:
+    void finishShape(SVGElement* element, PAINTMODE mode);
+    void setViewBox(SVGElement* root, MoxLength width, MoxLength height) const;
+    void setFillAttr(SVGElement& element, const GraphicContext& state, PAINTMODE mode) const;
+};
+
+} // namespace DrawmereNS

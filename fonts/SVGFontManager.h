@@ -1,0 +1,31 @@
+/// The registry of the fonts that a document carries.
+#pragma once
+
+#include "DrawmereExport.h"
+#include "SVGFont.h"
+#include "foundation/fontservice/FS_ExtraFonts.h"
+
+namespace DrawmereNS {
+
+class SVGTreeManager;
+
+using MoxFontService_NS::FS_ExtraFonts;
+
+/// Knows which font drawn text goes to, and writes the fonts of a document when it ends.
+/// No font is carried so far: text refers to fonts by name alone.
+class DRAWMERE_API SVGFontManager {
+public:
+    /// Borrows: `treeManager`, for its own life.
+    explicit SVGFontManager(SVGTreeManager* treeManager);
+
+    /// Selects the font of the text that follows. Ignores: a null font.
+    /// Borrows: both, for the call; `extraFonts` may be null.
+    void setCurrentFont(SVGFont* font, FS_ExtraFonts* extraFonts);
+
+    /// Writes the collected fonts into the tree.
+    void doEmbedFonts();
+
+    SVGTreeManager* treeManager; // borrowed
+};
+
+} // namespace DrawmereNS

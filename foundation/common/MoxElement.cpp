@@ -1,0 +1,153 @@
+#include "foundation/common/MoxElement.h"
+
+#include "foundation/common/MoxDocument.h"
+#include "foundation/common/MoxNameTable.h"
+#include "foundation/common/MoxXmlUtil.h"
+
+#include <algorithm>
+#include <cstdlib>
+#include <limits>
+#include <memory>
+#include <new>
+
+namespace MoxCommonNS {
+namespace {
+
+/// Capacities of 7, 15, 31 and so on fill what the allocator gives to the last byte.
+constexpr std::uint32_t firstCapacity = 7;
+constexpr std::uint32_t maxCapacity = std::numeric_limits<std::uint16_t>::max();
+
+constexpr std::uint32_t nextCapacity(std::uint32_t capacity) {
+    return capacity ? capacity * 2 + 1 : firstCapacity;
+}
+
+static_assert(nextCapacity(0x7FFF) == maxCapacity);
+
+/// The prefix that `attribute` declares for the namespace with the text `uri`, 0 when it is no
+/// declaration of that.
+MoxName getDeclaredPrefix(const MoxValue& attribute, const UnicodeString& uri) {
+    const UnicodeString& name = MoxNameTable::getSharedNameString(attribute.getKey());
+    return name.startsWith(u"xmlns:") && attribute.toString() == uri
+               ? MoxName(name.tempSubString(6))
+               : MoxName();
+}
+
+} // namespace
+
+MoxElement::MoxElement(MoxDocument* document) : MoxNode(MOXNODE_ELEMENT, document) {}
+
+MoxElement::~MoxElement() {
+    std::destroy_n(attributes, attributeCount);
+    std::free(attributes);
+}
+
+std::uint32_t MoxElement::getTypeID() const { return typeId; }
+
+bool MoxElement::isA(std::uint32_t id) const { return id == typeId || MoxNode::isA(id); }
+
+const char* MoxElement::getTypeName() const { return "MoxElement"; }
+
+MoxName MoxElement::getNodeName() const { return MoxXmlUtil::makeQName(prefix, local); }
+
+MoxName MoxElement::getLocalName() const { return local; }
+
+MoxName MoxElement::getPrefix() const { return prefix; }
+
+MoxAttributeMap MoxElement::getAttributes() const { return {attributes, attributeCount}; }
+
+const MoxValue& MoxElement::getAttribute(MoxName name) const {
+    const MoxValue* found = find(name);
+    return found ? *found : MoxValue::NULL_VALUE;
+}
+
+const MoxValue& MoxElement::getAttributeNS(MoxName namespaceUri, MoxName localName) const {
+    if (!namespaceUri) {
+        return getAttribute(localName);
+    }
+    const MoxDocument* document = getOwnerDocument();
+    const MoxElement* root = document ? document->getDocumentElement() : nullptr;
+    const UnicodeString& uriText = MoxNameTable::getSharedNameString(namespaceUri);
+    for (const MoxValue& attribute : (root ? root : this)->getAttributes()) {
+        const MoxName declared = getDeclaredPrefix(attribute, uriText);
+        const MoxName name = declared ? MoxXmlUtil::makeQName(declared, localName) : MoxName();
+        if (const MoxValue* found = name ? find(name) : nullptr) {
+            return *found;
+        }
+    }
+    return MoxValue::NULL_VALUE;
+}
+
+void MoxElement::setAttribute(MoxName name, const MoxValue& value) {
+    setAttribute(name, MoxValue(value));
+}
+
+void MoxElement::setAttribute(MoxName name, MoxValue&& value) {
+    if (!name || value.getType() == MOXVALUE_NULL) {
+        return;
+    }
+    MoxValue* place = find(name);
+    if (!place) {
+        place = append();
+    }
+    *place = std::move(value);
+    place->setKey(name);
+}
+
+void MoxElement::removeAttribute(MoxName name) {
+    MoxValue* found = find(name);
+    if (!found) {
+        return;
+    }
+    std::move(found + 1, attributes + attributeCount, found);
+    --attributeCount;
+    std::destroy_at(attributes + attributeCount);
+}
+
+bool MoxElement::hasAttribute(MoxName name) const { return find(name) != nullptr; }
+
+void MoxElement::setName(MoxName newUri, MoxName newPrefix, MoxName newLocal) {
+    uri = newUri;
+    prefix = newPrefix;
+    local = newLocal;
+}
+
+MoxPtr<MoxNode> MoxElement::cloneAlone() const {
+    const MoxPtr<MoxElement> copy = makeBlank();
+    copy->shareOwner(*this);
+    copy->setName(uri, prefix, local);
+    for (const MoxValue& attribute : getAttributes()) {
+        copy->setAttribute(attribute.getKey(), attribute);
+    }
+    return copy;
+}
+
+MoxPtr<MoxElement> MoxElement::makeBlank() const { return new MoxElement(nullptr); }
+
+MoxValue* MoxElement::find(MoxName name) const {
+    for (int i = 0; i < attributeCount; ++i) {
+        if (attributes[i].getKey() == name) {
+            return attributes + i;
+        }
+    }
+    return nullptr;
+}
+
+MoxValue* MoxElement::append() {
+    if (attributeCount == attributeCapacity) {
+        const std::uint32_t capacity = nextCapacity(attributeCapacity);
+        // Values hold no pointers into themselves, so they may move as plain bytes.
+        void* memory = capacity <= maxCapacity ? std::realloc(static_cast<void*>(attributes),
+                                                              capacity * sizeof(MoxValue))
+                                               : nullptr;
+        if (!memory) {
+            throw std::bad_alloc();
+        }
+        attributes = static_cast<MoxValue*>(memory);
+        attributeCapacity = static_cast<std::uint16_t>(capacity);
+    }
+    MoxValue* place = new (attributes + attributeCount) MoxValue;
+    ++attributeCount;
+    return place;
+}
+
+} // namespace MoxCommonNS

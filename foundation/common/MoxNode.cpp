@@ -1,0 +1,205 @@
+#include "foundation/common/MoxNode.h"
+
+#include "foundation/common/MoxDocument.h"
+#include "foundation/common/MoxText.h"
+#include "foundation/common/MoxTreeIterator.h"
+
+namespace MoxCommonNS {
+
+/// The way from nodes to their document, which may end before they do.
+struct MoxNode::DocumentLink : MoxRCObject {
+    MoxDocument* document = nullptr; // borrowed; null once it is no more
+};
+
+MoxNode::MoxNode(MoxNodeType nodeKind, MoxDocument* document)
+    : kind(nodeKind), owner(document ? document->owner : nullptr) {}
+
+MoxNode::~MoxNode() { releaseChildren(); }
+
+std::uint32_t MoxNode::getTypeID() const { return typeId; }
+
+bool MoxNode::isA(std::uint32_t id) const { return id == typeId || MoxNodeIterable::isA(id); }
+
+const char* MoxNode::getTypeName() const { return "MoxNode"; }
+
+MoxName MoxNode::getNodeName() const { return getLocalName(); }
+
+MoxName MoxNode::getLocalName() const { return {}; }
+
+MoxName MoxNode::getPrefix() const { return {}; }
+
+MoxValue MoxNode::getNodeValue() const { return MoxValue::NULL_VALUE; }
+
+int MoxNode::getNodeType() const { return kind; }
+
+MoxNode* MoxNode::getParentNode() const { return parent; }
+
+bool MoxNode::hasChildNodes() const { return firstChild != nullptr; }
+
+MoxNode* MoxNode::getFirstChild() const { return firstChild; }
+
+MoxNode* MoxNode::getPreviousSibling() const { return previousSibling; }
+
+MoxNode* MoxNode::getNextSibling() const { return nextSibling; }
+
+MoxDocument* MoxNode::getOwnerDocument() const { return owner ? owner->document : nullptr; }
+
+MoxNode* MoxNode::insertBefore(MoxNode* child, MoxNode* ref) {
+    if (!canTake(child, ref)) {
+        return nullptr;
+    }
+    if (child == ref) {
+        return child;
+    }
+    child->addRef();
+    if (child->parent) {
+        child->parent->removeChild(child);
+    }
+    link(child, ref);
+    if (child->owner != owner) {
+        child->setOwnerOfSubtree(owner);
+    }
+    return child;
+}
+
+void MoxNode::replaceChild(MoxNode* child, MoxNode* old) {
+    if (!old || old->parent != this || child == old) {
+        return;
+    }
+    // The old child goes first, so that a document may exchange its one root.
+    const MoxPtr<MoxNode> kept(old);
+    MoxNode* next = old->nextSibling == child ? child->nextSibling : old->nextSibling;
+    removeChild(old);
+    if (!insertBefore(child, next)) {
+        insertBefore(old, next);
+    }
+}
+
+void MoxNode::removeChild(MoxNode* child) {
+    if (!child || child->parent != this) {
+        return;
+    }
+    unlink(child);
+    child->release();
+}
+
+MoxNode* MoxNode::appendChild(MoxNode* child) { return insertBefore(child, nullptr); }
+
+MoxAttributeMap MoxNode::getAttributes() const { return {}; }
+
+MoxPtr<MoxNode> MoxNode::cloneNode(bool deep) const {
+    MoxPtr<MoxNode> copy = cloneAlone();
+    const MoxNode* from = this;
+    MoxNode* to = copy.get();
+    while (deep && from) {
+        if (from->firstChild) {
+            from = from->firstChild;
+        } else {
+            while (from != this && !from->nextSibling) {
+                from = from->parent;
+                to = to->parent;
+            }
+            if (from == this) {
+                break;
+            }
+            from = from->nextSibling;
+            to = to->parent;
+        }
+        to = to->appendChild(from->cloneAlone().get());
+    }
+    return copy;
+}
+
+bool MoxNode::isElementNode() const { return kind == MOXNODE_ELEMENT; }
+
+bool MoxNode::isText() const { return kind == MOXNODE_TEXT; }
+
+bool MoxNode::saveTextTag() const { return false; }
+
+UnicodeString MoxNode::getText() const { return {}; }
+
+void MoxNode::setText(const UnicodeString& /*text*/) {}
+
+MoxNode* MoxNode::appendChildText(const UnicodeString& text) {
+    const MoxPtr<MoxNode> node(new MoxText(getOwnerDocument(), text));
+    return appendChild(node.get());
+}
+
+MoxTreeIterator MoxNode::getIterator() const { return MoxTreeIterator(this); }
+
+bool MoxNode::canTake(const MoxNode* child, const MoxNode* ref) const {
+    if (!child || child->kind == MOXNODE_DOCUMENT || kind == MOXNODE_TEXT ||
+        (ref && ref->parent != this)) {
+        return false;
+    }
+    // Only a node with children can be an ancestor of this one.
+    const MoxNode* ancestor = child->firstChild || child == this ? this : nullptr;
+    while (ancestor && ancestor != child) {
+        ancestor = ancestor->parent;
+    }
+    return !ancestor && (kind != MOXNODE_DOCUMENT || hasRoomInDocument(child));
+}
+
+bool MoxNode::hasRoomInDocument(const MoxNode* child) const {
+    return child->kind == MOXNODE_ELEMENT && (!firstChild || firstChild == child);
+}
+
+void MoxNode::link(MoxNode* child, MoxNode* ref) {
+    MoxNode* before = ref ? ref->previousSibling : lastChild;
+    child->parent = this;
+    child->previousSibling = before;
+    child->nextSibling = ref;
+    (before ? before->nextSibling : firstChild) = child;
+    (ref ? ref->previousSibling : lastChild) = child;
+}
+
+void MoxNode::unlink(MoxNode* child) {
+    MoxNode* before = child->previousSibling;
+    MoxNode* behind = child->nextSibling;
+    (before ? before->nextSibling : firstChild) = behind;
+    (behind ? behind->previousSibling : lastChild) = before;
+    child->parent = nullptr;
+    child->previousSibling = nullptr;
+    child->nextSibling = nullptr;
+}
+
+void MoxNode::setOwnerOfSubtree(const MoxPtr<DocumentLink>& link) {
+    for (MoxTreeIterator nodes = getIterator(); nodes.hasNextNode();) {
+        nodes.nextNode()->owner = link;
+    }
+}
+
+void MoxNode::beginDocument(MoxDocument* document) {
+    owner = new DocumentLink;
+    owner->document = document;
+}
+
+void MoxNode::endDocument() { owner->document = nullptr; }
+
+void MoxNode::shareOwner(const MoxNode& other) { owner = other.owner; }
+
+void MoxNode::releaseChildren() {
+    // A dying child hands its children to this list, so the depth of the tree costs no stack.
+    MoxNode* pending = firstChild;
+    firstChild = nullptr;
+    lastChild = nullptr;
+    while (pending) {
+        MoxNode* child = pending;
+        pending = child->nextSibling;
+        child->parent = nullptr;
+        child->previousSibling = nullptr;
+        child->nextSibling = nullptr;
+        if (!child->releaseWithoutDelete()) {
+            continue;
+        }
+        if (child->firstChild) {
+            child->lastChild->nextSibling = pending;
+            pending = child->firstChild;
+            child->firstChild = nullptr;
+            child->lastChild = nullptr;
+        }
+        delete child;
+    }
+}
+
+} // namespace MoxCommonNS

@@ -1,0 +1,139 @@
+/// A node of the document tree.
+#pragma once
+
+#include "foundation/common/MoxAttributeMap.h"
+#include "foundation/common/MoxNodeIterable.h"
+#include "foundation/common/MoxPtr.h"
+
+namespace MoxCommonNS {
+
+class MoxDocument;
+class MoxTreeIterator;
+
+/// What a node is, by the numbers of the DOM.
+enum MoxNodeType : std::uint8_t {
+    MOXNODE_ELEMENT = 1,
+    MOXNODE_TEXT = 3,
+    MOXNODE_DOCUMENT = 9,
+};
+
+/// A node: it holds a reference to each of its children, and its children know it without one.
+/// A pointer to a node that an operation returns is borrowed; who keeps it longer than the tree
+/// does holds it in a `MoxPtr`. No operation recurses by the depth of the tree.
+class DRAWMERE_API MoxNode : public MoxNodeIterable {
+public:
+    static constexpr std::uint32_t typeId = 0xFF72074A;
+
+    /// Lets go of all children.
+    ~MoxNode() override;
+    std::uint32_t getTypeID() const override;
+    bool isA(std::uint32_t id) const override;
+    const char* getTypeName() const override;
+
+    /// Returns: the qualified name: prefix, colon and local name, or the local name alone.
+    virtual MoxName getNodeName() const;
+    virtual MoxName getLocalName() const;
+    /// Returns: the prefix, 0 when there is none.
+    virtual MoxName getPrefix() const;
+    /// Returns: the node's value, `NULL_VALUE` where a kind of node has none.
+    virtual MoxValue getNodeValue() const;
+    /// Returns: 1 element, 3 text, 9 document.
+    virtual int getNodeType() const;
+    virtual MoxNode* getParentNode() const;
+    virtual bool hasChildNodes() const;
+    virtual MoxNode* getFirstChild() const;
+    virtual MoxNode* getPreviousSibling() const;
+    virtual MoxNode* getNextSibling() const;
+    /// Returns: the document, borrowed; null when the node was made without one, and when the
+    /// document is no more.
+    virtual MoxDocument* getOwnerDocument() const;
+
+    /// Inserts `child` before `ref`, or behind all children when `ref` is null.
+    /// Owns: takes a reference to `child`; a child that has a parent moves.
+    /// Returns: `child`, or null when it can't stand here: a null, a node that would become its own
+    /// ancestor, a `ref` that is no child of this node, a document, a second element or a text in a
+    /// document, anything in a text. The tree is then as it was.
+    virtual MoxNode* insertBefore(MoxNode* child, MoxNode* ref);
+
+    /// Puts `child` in the place of `old`, which loses the parent's reference.
+    /// Ignores: what `insertBefore` refuses.
+    virtual void replaceChild(MoxNode* child, MoxNode* old);
+
+    /// Unlinks `child` and drops the parent's reference. Ignores: a node that is no child of this.
+    virtual void removeChild(MoxNode* child);
+
+    /// Appends `child` as `insertBefore` with a null `ref` does, and returns the same.
+    virtual MoxNode* appendChild(MoxNode* child);
+
+    /// Returns: the attributes, none for what is no element.
+    virtual MoxAttributeMap getAttributes() const;
+
+    /// Returns: a copy of the node, without a parent; of all below it too when `deep` is set.
+    virtual MoxPtr<MoxNode> cloneNode(bool deep) const;
+    virtual bool isElementNode() const;
+    virtual bool isText() const;
+    /// Returns: whether a text is saved with a tag of its own; no text of this library is.
+    virtual bool saveTextTag() const;
+    /// Returns: the text of a text node, empty for all others.
+    virtual UnicodeString getText() const;
+    /// Replaces the text of a text node. Ignores: every other node.
+    virtual void setText(const UnicodeString& text);
+    /// Appends a text node. Returns: the node, or null where none can stand.
+    virtual MoxNode* appendChildText(const UnicodeString& text);
+
+    /// Returns: a walk over this node and all below it, in document order.
+    MoxTreeIterator getIterator() const;
+
+    // Plain readings of the links, for walks that can't afford a virtual call for each step.
+    MoxNode* parentLink() const { return parent; }
+
+    MoxNode* firstLink() const { return firstChild; }
+
+    MoxNode* nextLink() const { return nextSibling; }
+
+    MoxNodeType kindLink() const { return kind; }
+
+protected:
+    MoxNode(MoxNodeType nodeKind, MoxDocument* document);
+
+    /// The copy of this node alone, for `cloneNode`.
+    virtual MoxPtr<MoxNode> cloneAlone() const = 0;
+
+    /// Makes `document`, whose base this is, the owner of itself and of all that it makes.
+    void beginDocument(MoxDocument* document);
+
+    /// Tells all nodes of the document, wherever they stand, that it is no more.
+    void endDocument();
+
+    /// Makes the document of `other` that of this node too.
+    void shareOwner(const MoxNode& other);
+
+private:
+    struct DocumentLink;
+
+    bool canTake(const MoxNode* child, const MoxNode* ref) const;
+    bool hasRoomInDocument(const MoxNode* child) const;
+    void link(MoxNode* child, MoxNode* ref);
+    void unlink(MoxNode* child);
+    void setOwnerOfSubtree(const MoxPtr<DocumentLink>& link);
+    void releaseChildren();
+
+    MoxNodeType kind;
+    MoxNode* parent = nullptr;          // borrowed
+    MoxNode* previousSibling = nullptr; // borrowed
+    MoxNode* nextSibling = nullptr;     // owned, by the parent's reference
+    MoxPtr<DocumentLink> owner;         // shared by all nodes of a document
+    MoxNode* firstChild = nullptr;      // owned, by reference
+    MoxNode* lastChild = nullptr;       // borrowed
+};
+
+/// Narrows a node to a class by the type test. Returns: null for null and for a no.
+template <typename T> T* narrow(MoxNode* node) {
+    return node && node->isA(T::typeId) ? static_cast<T*>(node) : nullptr;
+}
+
+template <typename T> const T* narrow(const MoxNode* node) {
+    return node && node->isA(T::typeId) ? static_cast<const T*>(node) : nullptr;
+}
+
+} // namespace MoxCommonNS

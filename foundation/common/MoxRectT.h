@@ -1,0 +1,27 @@
+/// A rectangle of any coordinate type.
+#pragma once
+
+#include "foundation/common/MoxPointT.h"
+
+namespace MoxCommonNS {
+
+/// A rectangle by two opposite corners, which may be any two: nothing sorts them.
+template <typename T> class MoxRectT {
+public:
+    constexpr MoxRectT() = default;
+
+    constexpr MoxRectT(const T& firstX, const T& firstY, const T& secondX, const T& secondY)
+        : x1(firstX), y1(firstY), x2(secondX), y2(secondY) {}
+
+    constexpr MoxRectT(const MoxPointT<T>& first, const MoxPointT<T>& second)
+        : MoxRectT(first.x, first.y, second.x, second.y) {}
+
+    constexpr bool operator==(const MoxRectT&) const = default;
+
+    T x1 = T();
+    T y1 = T();
+    T x2 = T();
+    T y2 = T();
+};
+
+} // namespace MoxCommonNS

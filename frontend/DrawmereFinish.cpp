@@ -1,0 +1,132 @@
+// Writing documents, the end of a run, and links by value.
+#include "Drawmere.h"
+#include "config/SVGZip.h"
+#include "draw/DrawmereImpl.h"
+#include "foundation/common/MoxCStr.h"
+#include "foundation/common/MoxNameTable.h"
+#include "foundation/common/MoxNamedValueMap.h"
+#include "frontend/DrawmereError.h"
+#include "refs/SVGReferenceId.h"
+
+#include <cstdio>
+
+namespace DrawmereNS {
+namespace {
+
+using MoxCommonNS::MoxNamedValueMap;
+using MoxCommonNS::MoxNameEnum;
+
+/// The text of a destination: that of a name or a string, nothing of any other value.
+UnicodeString toDestination(const MoxValue& value) {
+    const bool isText = value.getType() == MoxCommonNS::MOXVALUE_NAME ||
+                        value.getType() == MoxCommonNS::MOXVALUE_STRING;
+    return isText ? value.toString() : UnicodeString();
+}
+
+constexpr MoxNameEnum destinationKeys[] = {
+    MoxCommonNS::MOXNAME_ID,
+    MoxCommonNS::MOXNAME_NAME,
+    MoxCommonNS::MOXNAME_TARGET,
+};
+
+UnicodeString makeInternalUri(const MoxNamedValueMap& destination) {
+    const MoxValue& page = destination.getNamedItem(MoxCommonNS::MOXNAME_PAGE);
+    if (page.getKey()) {
+        // On purpose: a page has no "#" before its mark, so the solver leaves the link as it is.
+        return SVGReferenceId::getPageReferenceMark(page.getIntegerValue());
+    }
+    for (const MoxNameEnum key : destinationKeys) {
+        const MoxValue& item = destination.getNamedItem(key);
+        if (item.getKey()) {
+            return UnicodeString(u"#") + toDestination(item);
+        }
+    }
+    return UnicodeString(u"#");
+}
+
+} // namespace
+
+void Drawmere::saveDocument(MoxDocument* document, std::ostream* stream) {
+    if (!document || !stream) {
+        return;
+    }
+    const UnicodeString none;
+    if (!config->gzip) {
+        document->save(config->encoding, none, *stream, nullptr, config->saveOption, none);
+        return;
+    }
+    SVGZipStream zip(*stream);
+    document->save(config->encoding, none, zip, nullptr, config->saveOption, none);
+}
+
+void Drawmere::finish() {
+    try {
+        finishRun();
+    } catch (const MoxError& error) {
+        errorHandler->handleError(error);
+    } catch (...) {
+        errorHandler->handleError();
+    }
+}
+
+void Drawmere::finishRun() {
+    solveReferences();
+    const bool oneDocument = config->streamOutput || config->singleFile;
+    if (!oneDocument) {
+        writeKeptDocuments();
+    } else if (!documents.empty()) {
+        MoxDocument* first = documents.begin()->second.get();
+        if (config->streamOutput) {
+            writeStream(first);
+        } else {
+            writeFile(first, outputPath);
+        }
+    }
+    if (!oneDocument && pageCount == 1 && !config->keepPageNumber) {
+        renameOnlyPage();
+    }
+}
+
+void Drawmere::solveReferences() {
+    SVGReferenceId references;
+    references.setRefernceIdInfo(config->singleFile, allAnchors, anchorPages, pageFiles);
+    for (const auto& [page, document] : documents) {
+        references.solveReferenceId(page, document->getDocumentElement());
+    }
+}
+
+void Drawmere::writeKeptDocuments() {
+    for (const auto& [page, document] : documents) {
+        writeFile(document.get(), makePagePath(page));
+    }
+}
+
+void Drawmere::writeStream(MoxDocument* document) {
+    if (!outputStream) {
+        DrawmereError::throwError(16414, outputPath);
+    }
+    saveDocument(document, outputStream);
+    // The stream stays the caller's, open and not flushed: what it has refused so far is known here,
+    // the rest when the caller flushes or closes it.
+    if (!outputStream->good()) {
+        DrawmereError::throwError(16414, outputPath);
+    }
+}
+
+void Drawmere::renameOnlyPage() const {
+    MoxCommonNS::MoxCStr numbered(makePagePath(firstPage));
+    // On purpose: the text of the URI as the caller gave it, so a "file:" URI names no file here.
+    MoxCommonNS::MoxCStr plain(pageUri->getText());
+    // A file that can't be renamed keeps its number.
+    static_cast<void>(std::rename(numbered.toCStr(), plain.toCStr()));
+}
+
+void Drawmere::startLink(const MoxValue& link) {
+    const MoxValue& internal = link.getNamedItem(MoxCommonNS::MOXNAME_INTERNAL);
+    const UnicodeString uri = internal == MoxValue::NULL_VALUE
+                                  ? toDestination(link.getNamedItem(MoxCommonNS::MOXNAME_EXTERNAL))
+                                  : makeInternalUri(internal.getNamedValueMap());
+    startLink(uri, link.getNamedItem(MoxCommonNS::MOXNAME_SHOW).getNameValue());
+}
+
+} // namespace DrawmereNS

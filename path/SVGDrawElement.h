@@ -1,0 +1,207 @@
+/// The segments of a path.
+#pragma once
+
+#include "foundation/common/MoxLength.h"
+#include "foundation/common/MoxPointT.h"
+#include "foundation/common/MoxRCObject.h"
+#include "foundation/common/MoxString.h"
+
+#include <memory>
+
+namespace DrawmereNS {
+
+using MoxCommonNS::MoxLength;
+using MoxCommonNS::MoxPointT;
+using MoxCommonNS::MoxRCObject;
+
+/// A command of path data and its form: odd numbers are absolute.
+enum DrawmereDrawElementEnum : std::int32_t {
+    DRAWELEMENT_NONE = 0,
+    DRAWELEMENT_MOVE = 1,
+    DRAWELEMENT_MOVE_RELATIVE = 2,
+    DRAWELEMENT_LINE = 3,
+    DRAWELEMENT_LINE_RELATIVE = 4,
+    DRAWELEMENT_CLOSE = 5,
+    DRAWELEMENT_CLOSE_RELATIVE = 6,
+    DRAWELEMENT_CUBIC = 7,
+    DRAWELEMENT_CUBIC_RELATIVE = 8,
+    DRAWELEMENT_QUADRATIC = 9,
+    DRAWELEMENT_QUADRATIC_RELATIVE = 10, ///< never assigned
+    DRAWELEMENT_UNSET = 11,
+};
+
+/// One segment: a command and its points. It stays an object until the path ends, because only then
+/// can it be made relative to where the segment before it ends. Its text is made when it is asked
+/// for.
+class DRAWMERE_API SVGDrawElement : public MoxRCObject {
+public:
+    static constexpr std::uint32_t typeId = 0x28116EDF;
+    /// Room that the text of any segment fits into: a letter, six numbers and what parts them.
+    static constexpr std::size_t maxText = 272;
+
+    ~SVGDrawElement() override;
+    std::uint32_t getTypeID() const override;
+    bool isA(std::uint32_t id) const override;
+    const char* getTypeName() const override;
+
+    // What a class does not override does nothing, or gives (0, 0).
+
+    virtual void setPoint(const MoxPointT<MoxLength>& newPoint);
+    virtual MoxPointT<MoxLength> getPoint() const;
+    virtual void setPoint1(const MoxPointT<MoxLength>& newPoint);
+    virtual MoxPointT<MoxLength> getPoint1() const;
+    virtual void setPoint2(const MoxPointT<MoxLength>& newPoint);
+    virtual MoxPointT<MoxLength> getPoint2() const;
+
+    /// Makes the points relative to `origin`; a coordinate that is a NaN stays as it is.
+    virtual void makeRelative(const MoxPointT<MoxLength>& origin);
+
+    /// Returns: the text of the segment, valid until the segment changes; null for a class that
+    /// stands for no command.
+    virtual const char* toString();
+
+    /// Writes the text without a terminator; nothing for a class that stands for no command.
+    /// Shape: `out` has room for `maxText` characters. Returns: the end of the text.
+    virtual char16_t* writeText(char16_t* out) const;
+
+    void setDrawType(DrawmereDrawElementEnum type) { drawType = type; }
+
+    void setDrawName(DrawmereDrawElementEnum name) { drawName = name; }
+
+    /// Returns: true for the absolute commands.
+    bool isAbsolute() const;
+
+    /// Writes a length by the number rule of path data, with a terminator.
+    /// Shape: `buffer` of `size` characters; a text that does not fit is cut.
+    static void makeLengthToStringValue(const MoxLength& length, char* buffer, unsigned long size);
+    /// Writes x, a comma and y in the same way.
+    static void makePointToStringValue(const MoxPointT<MoxLength>& point, char* buffer,
+                                       unsigned long size);
+    static UnicodeString makeLengthToStringValue(const MoxLength& length);
+    static UnicodeString makePointToStringValue(const MoxPointT<MoxLength>& point);
+
+    DrawmereDrawElementEnum drawType = DRAWELEMENT_UNSET;
+    DrawmereDrawElementEnum drawName = DRAWELEMENT_UNSET;
+
+protected:
+    explicit SVGDrawElement(char commandLetter) : letter(commandLetter) {}
+
+    /// The text of `writeText` as bytes, kept until the next call.
+    const char* makeText();
+
+    char letter;
+
+private:
+    std::unique_ptr<char[]> text; // made at the first `toString`
+};
+
+/// The end of a subpath.
+class DRAWMERE_API SVGDrawElementClose : public SVGDrawElement {
+public:
+    static constexpr std::uint32_t typeId = 0xA9477E24;
+
+    SVGDrawElementClose();
+    std::uint32_t getTypeID() const override;
+    bool isA(std::uint32_t id) const override;
+    const char* getTypeName() const override;
+    void makeRelative(const MoxPointT<MoxLength>& origin) override;
+    const char* toString() override;
+    char16_t* writeText(char16_t* out) const override;
+};
+
+/// A segment with one point.
+class DRAWMERE_API SVGDrawElementPointTo : public SVGDrawElement {
+public:
+    static constexpr std::uint32_t typeId = 0xE2EDBCC5;
+
+    std::uint32_t getTypeID() const override;
+    bool isA(std::uint32_t id) const override;
+    const char* getTypeName() const override;
+    void setPoint(const MoxPointT<MoxLength>& newPoint) override;
+    MoxPointT<MoxLength> getPoint() const override;
+
+    MoxPointT<MoxLength> point;
+
+protected:
+    SVGDrawElementPointTo(char commandLetter, const MoxPointT<MoxLength>& target)
+        : SVGDrawElement(commandLetter), point(target) {}
+};
+
+/// The start of a subpath.
+class DRAWMERE_API SVGDrawElementMoveTo : public SVGDrawElementPointTo {
+public:
+    static constexpr std::uint32_t typeId = 0x0136266E;
+
+    explicit SVGDrawElementMoveTo(const MoxPointT<MoxLength>& target);
+    std::uint32_t getTypeID() const override;
+    bool isA(std::uint32_t id) const override;
+    const char* getTypeName() const override;
+    void makeRelative(const MoxPointT<MoxLength>& origin) override;
+    const char* toString() override;
+    char16_t* writeText(char16_t* out) const override;
+};
+
+/// A line. A relative one that is horizontal or vertical takes the shorter command.
+class DRAWMERE_API SVGDrawElementLineTo : public SVGDrawElementPointTo {
+public:
+    static constexpr std::uint32_t typeId = 0xFC9F018C;
+
+    explicit SVGDrawElementLineTo(const MoxPointT<MoxLength>& target);
+    std::uint32_t getTypeID() const override;
+    bool isA(std::uint32_t id) const override;
+    const char* getTypeName() const override;
+    void makeRelative(const MoxPointT<MoxLength>& origin) override;
+    const char* toString() override;
+    char16_t* writeText(char16_t* out) const override;
+};
+
+/// A curve with two control points and a target.
+class DRAWMERE_API SVGDrawElementCubicBezierCurveTo : public SVGDrawElement {
+public:
+    static constexpr std::uint32_t typeId = 0xCE93740D;
+
+    SVGDrawElementCubicBezierCurveTo(const MoxPointT<MoxLength>& control1,
+                                     const MoxPointT<MoxLength>& control2,
+                                     const MoxPointT<MoxLength>& target);
+    std::uint32_t getTypeID() const override;
+    bool isA(std::uint32_t id) const override;
+    const char* getTypeName() const override;
+    /// Returns: the target. `setPoint` does nothing, as in the base.
+    MoxPointT<MoxLength> getPoint() const override;
+    void setPoint1(const MoxPointT<MoxLength>& newPoint) override;
+    MoxPointT<MoxLength> getPoint1() const override;
+    void setPoint2(const MoxPointT<MoxLength>& newPoint) override;
+    MoxPointT<MoxLength> getPoint2() const override;
+    void makeRelative(const MoxPointT<MoxLength>& origin) override;
+    const char* toString() override;
+    char16_t* writeText(char16_t* out) const override;
+
+    MoxPointT<MoxLength> point1;
+    MoxPointT<MoxLength> point2;
+    MoxPointT<MoxLength> point;
+};
+
+/// A curve with one control point and a target.
+/// On purpose: only the second pair of accessors is overridden, it reaches the first point, and
+/// `getPoint` gives (0, 0). So the segment behind a quadratic one is relative to the origin.
+class DRAWMERE_API SVGDrawElementQuadraticBezierCurveTo : public SVGDrawElement {
+public:
+    static constexpr std::uint32_t typeId = 0xAD56D32A;
+
+    SVGDrawElementQuadraticBezierCurveTo(const MoxPointT<MoxLength>& control,
+                                         const MoxPointT<MoxLength>& target);
+    std::uint32_t getTypeID() const override;
+    bool isA(std::uint32_t id) const override;
+    const char* getTypeName() const override;
+    void setPoint2(const MoxPointT<MoxLength>& newPoint) override;
+    MoxPointT<MoxLength> getPoint2() const override;
+    /// Leaves `drawName` alone, so `isAbsolute` stays true.
+    void makeRelative(const MoxPointT<MoxLength>& origin) override;
+    const char* toString() override;
+    char16_t* writeText(char16_t* out) const override;
+
+    MoxPointT<MoxLength> point1;
+    MoxPointT<MoxLength> point2;
+};
+
+} // namespace DrawmereNS

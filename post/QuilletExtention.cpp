@@ -1,0 +1,7 @@
+#include "post/QuilletExtention.h"
+
+namespace DrawmereNS {
+
+void QuilletExtention::optimizeQuillet(MoxElement* /*root*/) {}
+
+} // namespace DrawmereNS

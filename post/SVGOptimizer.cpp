@@ -1,0 +1,63 @@
+#include "post/SVGOptimizer.h"
+
+#include "foundation/common/MoxTreeIterator.h"
+#include "tree/SVGUtil.h"
+
+#include <unicode/locid.h>
+
+namespace DrawmereNS {
+
+using MoxCommonNS::MoxNode;
+using MoxCommonNS::MoxTreeIterator;
+using TalCommon::SVGName;
+
+namespace {
+
+constexpr char16_t smallDeviceProfile[] = u"wisp";
+
+UnicodeString readBaseProfile(const MoxElement& root) {
+    // The locale of the user must play no part: in Turkish an I would lose its dot.
+    return root.getAttribute(SVGName(SVGName::baseProfile))
+        .toString()
+        .toLower(icu::Locale::getRoot());
+}
+
+bool isEmptyGroup(const MoxNode& node) {
+    const auto* element = MoxCommonNS::narrow<MoxElement>(&node);
+    return element && !element->hasChildNodes() && SVGUtil::getSVGLocalName(element) == SVGName::g;
+}
+
+/// On purpose: an empty group goes only when the walk gives the node behind it. So the last node of
+/// a document stays, and so does a group that loses its last group, as it was tested before.
+void removeEmptyGroups(MoxElement& root) {
+    MoxNode* pending = nullptr;
+    MoxTreeIterator walk(&root);
+    while (walk.hasNextNode()) {
+        MoxNode* node = walk.nextNode();
+        if (pending) {
+            pending->getParentNode()->removeChild(pending);
+        }
+        pending = isEmptyGroup(*node) ? node : nullptr;
+    }
+}
+
+} // namespace
+
+void SVGOptimizer::optimize(MoxElement* root) {
+    if (!root) {
+        return;
+    }
+    if (readBaseProfile(*root) == UnicodeString(smallDeviceProfile)) {
+        optimizeDefsTiny(root);
+    }
+    removeEmptyGroups(*root);
+}
+
+void SVGOptimizer::optimizeDefsTiny(MoxElement* root) {
+    MoxElement* defs = SVGUtil::findFirstChildLocalName(root, SVGName(SVGName::defs));
+    if (defs && !SVGUtil::getFirstChildElement(defs)) {
+        root->removeChild(defs);
+    }
+}
+
+} // namespace DrawmereNS

@@ -1,0 +1,166 @@
+// The part of the graphic state that decides which attributes an element needs.
+#include "foundation/common/MoxDocument.h"
+#include "foundation/common/MoxNameTable.h"
+#include "state/SVGGraphicContext.h"
+#include "tree/SVGUtil.h"
+
+namespace DrawmereNS {
+namespace {
+
+using MoxCommonNS::MoxDocument;
+using MoxCommonNS::MoxNameTable;
+using MoxCommonNS::MoxNode;
+using MoxCommonNS::MoxValueType;
+using MoxCommonNS::narrow;
+
+SVGName nameOf(const MoxNode* node) { return SVGUtil::getSVGLocalName(narrow<MoxElement>(node)); }
+
+bool isTextOrGroup(SVGName name) { return name == SVGName::text || name == SVGName::g; }
+
+/// The level of matrix that an element takes by where it stands: a closing group under the root
+/// takes the root's, any other closing group its own, and what stands in an open group the current.
+TRANSFORMMODE findTransformMode(const SVGElement& element, SVGName name) {
+    if (nameOf(element.getParentNode()) == SVGName::svg) {
+        return TRANSFORMMODE_ROOT;
+    }
+    const bool isContainer = element.hasChildNodes() && name != SVGName::text;
+    return isContainer ? TRANSFORMMODE_GROUP : TRANSFORMMODE_CURRENT;
+}
+
+bool closesAroundText(const SVGElement& element) {
+    return SVGUtil::getSVGLocalName(&element) == SVGName::g &&
+           nameOf(element.getFirstChild()) == SVGName::text;
+}
+
+MoxElement* findRoot(const SVGElement& element) {
+    const MoxDocument* document = element.getOwnerDocument();
+    return document ? narrow<MoxElement>(document->getFirstChild()) : nullptr;
+}
+
+/// Whether the root's font-family, a text or a name, says `family`; any other value says nothing.
+bool saysFamily(const MoxValue& value, const UnicodeString& family) {
+    switch (value.getType()) {
+    case MoxValueType::MOXVALUE_STRING:
+        return value == MoxValue(family);
+    case MoxValueType::MOXVALUE_NAME:
+        return MoxNameTable::getSharedNameString(value.getNameValue()) == family;
+    default:
+        return family.isEmpty();
+    }
+}
+
+/// Gives the family to a root that has none yet.
+/// Returns: whether the root now says `family`, so that a group need not.
+bool rootTakesFamily(MoxElement* root, const UnicodeString& family) {
+    if (!root) {
+        return false;
+    }
+    if (!root->hasAttribute(SVGName(SVGName::font_family))) {
+        root->setAttribute(SVGName(SVGName::font_family), MoxValue(family));
+    }
+    return saysFamily(root->getAttribute(SVGName(SVGName::font_family)), family);
+}
+
+void writeUnlessNormal(SVGElement* element, SVGName name, const UnicodeString& text) {
+    if (text != u"normal") {
+        element->setSVGAttribute(name, MoxValue(text));
+    }
+}
+
+} // namespace
+
+SVGGraphicContext::Levels SVGGraphicContext::getLevels(bool isGroup) const {
+    return isGroup ? Levels{groupGC, getDefaultGC()} : Levels{currentGC, groupGC};
+}
+
+void SVGGraphicContext::AttrValueCompare(SVGElement* element, bool isGroup, ELEMENTTYPE kind) {
+    if (!element) {
+        return;
+    }
+    const SVGName name = SVGUtil::getSVGLocalName(element);
+    setTransformAttr(element, findTransformMode(*element, name));
+    if (kind == ELEMENTTYPE_SHAPE || kind == ELEMENTTYPE_TEXT) {
+        writeStrokeDifferences(element, isGroup);
+    }
+    if (kind == ELEMENTTYPE_TEXT) {
+        writeTextDifferences(element, isGroup);
+    }
+    // On purpose: a shape among texts, as in a clip definition, gets neither mask nor opacity.
+    if (kind >= ELEMENTTYPE_TEXT && !isTextOrGroup(name)) {
+        return;
+    }
+    const Levels levels = getLevels(isGroup);
+    if (!isTiny() && levels.subject.maskReference != levels.reference.maskReference) {
+        element->setSVGAttribute(SVGName::mask, MoxValue(levels.subject.maskReference));
+    }
+    setOpacityAttribute(element, OPACITYDEST_ELEMENT, isGroup, /*asOpacity=*/false);
+}
+
+void SVGGraphicContext::writeStrokeDifferences(SVGElement* element, bool isGroup) const {
+    const auto& [subject, reference] = getLevels(isGroup);
+    if (subject.lineCap != reference.lineCap) {
+        setStrokeAttribute(element, ATTRIBUTEFLAG_LINECAP, isGroup);
+    }
+    if (subject.lineJoin != reference.lineJoin) {
+        setStrokeAttribute(element, ATTRIBUTEFLAG_LINEJOIN, isGroup);
+    }
+    if (subject.strokeWidth != reference.strokeWidth) {
+        setStrokeAttribute(element, ATTRIBUTEFLAG_STROKEWIDTH, isGroup);
+    }
+    if (subject.miterLimit != reference.miterLimit) {
+        setStrokeAttribute(element, ATTRIBUTEFLAG_MITERLIMIT, isGroup);
+    }
+    setOpacityAttribute(element, OPACITYDEST_STROKE, isGroup, /*asOpacity=*/false);
+    if (subject.dashOffset != reference.dashOffset) {
+        setStrokeAttribute(element, ATTRIBUTEFLAG_DASHOFFSET, isGroup);
+    }
+    if (subject.dashArray != reference.dashArray) {
+        setStrokeAttribute(element, ATTRIBUTEFLAG_DASHARRAY, isGroup);
+    }
+    setOpacityAttribute(element, OPACITYDEST_FILL, isGroup, /*asOpacity=*/false);
+}
+
+void SVGGraphicContext::writeTextDifferences(SVGElement* element, bool isGroup) const {
+    const auto& [subject, reference] = getLevels(isGroup);
+    if (closesAroundText(*element)) {
+        writeFont(element, subject.font);
+    }
+    // On purpose: word spacing is compared with the default, so each text of a group that has one
+    // carries it; compared with the group, the first text would lose it.
+    if (!isTiny() && SVGUtil::getSVGLocalName(element) == SVGName::text &&
+        subject.wordSpacing != getDefaultGC().wordSpacing) {
+        const float spacing = subject.wordSpacing.getRealValue(MoxCommonNS::MOXUNIT_POINT);
+        element->setSVGAttribute(SVGName::word_spacing, MoxValue(spacing));
+    }
+    if (!isTiny() && subject.writingMode != reference.writingMode) {
+        setTextAttribute(element, ATTRIBUTEFLAG_WRITINGMODE, isGroup);
+    }
+    if (subject.textAnchor != reference.textAnchor) {
+        setTextAttribute(element, ATTRIBUTEFLAG_TEXTANCHOR, isGroup);
+    }
+    if (!isTiny() && !isGroup) {
+        setTextAttribute(element, ATTRIBUTEFLAG_TEXTDECORATION, isGroup);
+    }
+}
+
+void SVGGraphicContext::writeFont(SVGElement* group, const SVGFont& font) const {
+    SVGFontAttr2String::FONTATTRSTRING texts;
+    SVGFontAttr2String::getFontAttrStr(font, texts);
+    // On purpose: the first text group gives its family to the root and carries none itself.
+    if (!rootTakesFamily(findRoot(*group), font.fontFamily)) {
+        group->setSVGAttribute(SVGName::font_family, MoxValue(font.fontFamily));
+    }
+    group->setSVGAttribute(SVGName::font_size, MoxValue(texts.fontSize));
+    writeUnlessNormal(group, SVGName::font_style, texts.fontStyle);
+    writeUnlessNormal(group, SVGName::font_weight, texts.fontWeight);
+    if (!isTiny()) {
+        writeUnlessNormal(group, SVGName::font_stretch, texts.fontStretch);
+    }
+}
+
+void SVGGraphicContext::setGroupAttrs(SVGElement* group, ELEMENTTYPE kind) {
+    AttrValueCompare(group, /*isGroup=*/true, kind);
+    changeCount = 0;
+}
+
+} // namespace DrawmereNS
