@@ -147,13 +147,18 @@ void DrawmereImpl::finishRootSvg() {
     fontManager->doEmbedFonts();
     groupManager->appendToTree();
     MoxElement* root = treeManager->document->getDocumentElement();
-    SVGOptimizer::optimize(root);
+    if (documentIsShown || treeManager->groupsMayBeEmpty) {
+        SVGOptimizer::optimize(root);
+    }
     if (config->svgType == SVGConfig::SVGTYPE_TINY && config->wispMode) {
         QuilletExtention().optimizeQuillet(root);
     }
 }
 
-SVGDocument* DrawmereImpl::getDocument() const { return treeManager->document.get(); }
+SVGDocument* DrawmereImpl::getDocument() {
+    documentIsShown = true;
+    return treeManager->document.get();
+}
 
 SVGGraphicContext* DrawmereImpl::getGContext() const { return groupManager->getGContext(); }
 

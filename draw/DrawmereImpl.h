@@ -161,8 +161,13 @@ public:
     /// Completes the tree; the document can be saved afterwards.
     void finishRootSvg();
 
-    /// Returns: the document, borrowed; it lives on in any `MoxPtr` that takes it.
-    SVGDocument* getDocument() const;
+    /// Returns: the document, borrowed; it lives on in any `MoxPtr` that takes it. Who changes its
+    /// tree has asked for it here: a document that nobody asked for is known without a walk.
+    SVGDocument* getDocument();
+
+    /// Returns: whether the document may hold links; false is certain.
+    bool mayHoldLinks() const { return hasLinks || documentIsShown; }
+
     /// Returns: the state that setters change now, borrowed; while a path is open that is a state
     /// of the path's own, which is thrown away with it.
     SVGGraphicContext* getGContext() const;
@@ -208,6 +213,9 @@ private:
     void finishShape(SVGElement* element, PAINTMODE mode);
     void setViewBox(SVGElement* root, MoxLength width, MoxLength height) const;
     void setFillAttr(SVGElement& element, const GraphicContext& state, PAINTMODE mode) const;
+
+    bool hasLinks = false;
+    bool documentIsShown = false;
 };
 
 } // namespace DrawmereNS

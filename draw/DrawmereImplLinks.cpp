@@ -17,6 +17,7 @@ void DrawmereImpl::startLink(const UnicodeString& href, const MoxName& show) {
                            MoxValue(MoxCommonNS::MoxNameTable::getSharedNameString(show)));
         link->setAttribute(MoxName(MoxCommonNS::MOXNAME_TARGET), MoxValue(u"_blank"));
     }
+    hasLinks = true;
     pushState(ELEMENT_TYPE_LINK);
     addElement(link.get(), /*direct=*/true, /*makeCurrent=*/true);
 }

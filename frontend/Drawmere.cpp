@@ -9,6 +9,7 @@
 #include "foundation/common/MoxUtil.h"
 #include "frontend/DrawmereError.h"
 #include "refs/SVGReferenceId.h"
+#include "tree/SVGTreeManager.h"
 
 namespace DrawmereNS {
 namespace {
@@ -175,15 +176,16 @@ void Drawmere::finishRootSvg() {
 
 void Drawmere::finishOpenDocument() {
     impl->finishRootSvg();
-    const MoxPtr<MoxDocument> document(impl->getDocument());
+    const MoxPtr<MoxDocument> document(impl->treeManager->document.get());
     if (config->streamOutput || config->singleFile) {
         documents.emplace(currentPage, document);
         closeImpl();
         return;
     }
     SVGReferenceId references;
-    references.setRefernceIdInfo(/*singleFile=*/false, allAnchors, anchorPages, pageFiles);
-    if (references.isSolvedReferenceId(currentPage, document->getDocumentElement())) {
+    references.setRefernceIdInfo(/*isSingleFile=*/false, allAnchors, anchorPages, pageFiles);
+    if (!impl->mayHoldLinks() ||
+        references.isSolvedReferenceId(currentPage, document->getDocumentElement())) {
         writeFile(document.get(), makePagePath(currentPage));
     } else {
         documents.emplace(currentPage, document);

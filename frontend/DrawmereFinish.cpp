@@ -106,8 +106,8 @@ void Drawmere::writeStream(MoxDocument* document) {
         DrawmereError::throwError(16414, outputPath);
     }
     saveDocument(document, outputStream);
-    // The stream stays the caller's, open and not flushed: what it has refused so far is known here,
-    // the rest when the caller flushes or closes it.
+    // The stream stays the caller's, open and not flushed: what it has refused so far is known
+    // here, the rest when the caller flushes or closes it.
     if (!outputStream->good()) {
         DrawmereError::throwError(16414, outputPath);
     }

@@ -7,6 +7,7 @@
 
 namespace DrawmereNS {
 
+using MoxCommonNS::MoxName;
 using MoxCommonNS::MoxNode;
 using MoxCommonNS::MoxTreeIterator;
 using TalCommon::SVGName;
@@ -23,8 +24,8 @@ UnicodeString readBaseProfile(const MoxElement& root) {
 }
 
 bool isEmptyGroup(const MoxNode& node) {
-    const auto* element = MoxCommonNS::narrow<MoxElement>(&node);
-    return element && !element->hasChildNodes() && SVGUtil::getSVGLocalName(element) == SVGName::g;
+    return node.kindLink() == MoxCommonNS::MOXNODE_ELEMENT && !node.firstLink() &&
+           static_cast<const MoxElement&>(node).localLink() == MoxName(SVGName(SVGName::g));
 }
 
 /// On purpose: an empty group goes only when the walk gives the node behind it. So the last node of

@@ -3,8 +3,8 @@
 #include "foundation/common/MoxNameTable.h"
 #include "foundation/common/MoxParser.h"
 #include "foundation/common/MoxUtil.h"
+#include "foundation/names/SVGName.h"
 #include "refs/SVGRefIDManager.h"
-#include "tree/SVGUtil.h"
 
 #include <iterator>
 
@@ -12,6 +12,7 @@ namespace DrawmereNS {
 
 using MoxCommonNS::MoxName;
 using MoxCommonNS::MoxNameTable;
+using MoxCommonNS::MoxNode;
 using MoxCommonNS::MoxParser;
 using MoxCommonNS::MoxTokenizer;
 using MoxCommonNS::MoxUtil;
@@ -40,14 +41,31 @@ UnicodeString getAttributeText(const MoxElement& element, MoxName name) {
     return getText(element.getAttribute(name));
 }
 
+bool isNamed(const MoxElement& element, SVGName::Number name) {
+    return element.localLink() == MoxName(SVGName(name));
+}
+
+MoxElement* toElement(MoxNode* node) {
+    return node && node->kindLink() == MoxCommonNS::MOXNODE_ELEMENT ? static_cast<MoxElement*>(node)
+                                                                    : nullptr;
+}
+
+MoxElement* findFirstChild(const MoxElement& element) {
+    MoxNode* child = element.firstLink();
+    while (child && child->kindLink() != MoxCommonNS::MOXNODE_ELEMENT) {
+        child = child->nextLink();
+    }
+    return toElement(child);
+}
+
 /// Returns: the element after `element` in document order, within the subtree of `root`, or null.
 /// On purpose: a text between two elements ends the row of siblings, as it does for all walks over
 /// them; links behind it stay as they are.
 MoxElement* findFollowing(MoxElement* element, const MoxElement* root, bool enterChildren) {
-    MoxElement* next = enterChildren ? SVGUtil::getFirstChildElement(element) : nullptr;
+    MoxElement* next = enterChildren ? findFirstChild(*element) : nullptr;
     while (!next && element && element != root) {
-        next = SVGUtil::getNextSiblingElement(element);
-        element = MoxCommonNS::narrow<MoxElement>(element->getParentNode());
+        next = toElement(element->nextLink());
+        element = toElement(element->parentLink());
     }
     return next;
 }
@@ -93,8 +111,8 @@ bool SVGReferenceId::isSolvedId(const UnicodeString& reference) const {
 bool SVGReferenceId::isSolvedReferenceId(int, MoxElement* element) const {
     const MoxElement* const root = element;
     while (element) {
-        const bool isLink = SVGUtil::getSVGLocalName(element) == SVGName::a;
-        if (isLink && !isSolvedId(getAttributeText(*element, getHrefName()))) {
+        if (isNamed(*element, SVGName::a) &&
+            !isSolvedId(getAttributeText(*element, getHrefName()))) {
             return false;
         }
         element = findFollowing(element, root, /*enterChildren=*/true);
@@ -173,11 +191,10 @@ void SVGReferenceId::solveAnchor(MoxElement& text) {
 
 /// Returns: whether the children of the element are to be solved too.
 bool SVGReferenceId::solveElement(MoxElement& element) {
-    const SVGName name = SVGUtil::getSVGLocalName(&element);
-    if (name == SVGName::a) {
+    if (isNamed(element, SVGName::a)) {
         return solveLink(element);
     }
-    if (name == SVGName::text) {
+    if (isNamed(element, SVGName::text)) {
         solveAnchor(element);
     }
     return true;

@@ -1,45 +1,8 @@
 #include "state/GraphicContext.h"
 
-#include <cstdint>
-#include <cstring>
+#include "state/TextCopy.h"
 
 namespace DrawmereNS {
-namespace {
-
-constexpr int unitsAtOnce = 4;
-
-std::uint64_t loadUnits(const char16_t* units) {
-    std::uint64_t result = 0;
-    std::memcpy(&result, units, sizeof(result));
-    return result;
-}
-
-/// Compares by eight bytes: most texts are that short, and ICU's comparison is two calls.
-bool haveSameUnits(const char16_t* one, const char16_t* other, int count) {
-    for (; count >= unitsAtOnce; count -= unitsAtOnce) {
-        if (loadUnits(one) != loadUnits(other)) {
-            return false;
-        }
-        one += unitsAtOnce;
-        other += unitsAtOnce;
-    }
-    for (; count > 0; --count) {
-        if (*one++ != *other++) {
-            return false;
-        }
-    }
-    return true;
-}
-
-} // namespace
-
-void assignText(UnicodeString& to, const UnicodeString& from) {
-    const bool isSame = to.length() == from.length() && to.isBogus() == from.isBogus() &&
-                        haveSameUnits(to.getBuffer(), from.getBuffer(), to.length());
-    if (!isSame) {
-        to = from;
-    }
-}
 
 void assignFont(SVGFont& to, const SVGFont& from) {
     assignText(to.fontName, from.fontName);

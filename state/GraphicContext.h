@@ -15,11 +15,7 @@ namespace DrawmereNS {
 using MoxCommonNS::MoxLength;
 using MoxCommonNS::MoxName;
 
-/// Makes `to` the text of `from`; a text that is the same already is left alone. States are saved,
-/// restored and moved between levels far more often than their texts change.
-void assignText(UnicodeString& to, const UnicodeString& from);
-
-/// The same for all members of a font.
+/// Makes `to` the font `from`, where they differ.
 void assignFont(SVGFont& to, const SVGFont& from);
 
 /// A plain record, copied member by member; texts are ready to be written as they stand. The order

@@ -1,6 +1,7 @@
 #include "state/SVGGraphicContext.h"
 
 #include "foundation/common/MoxColor.h"
+#include "state/TextCopy.h"
 #include "tree/SVGUtil.h"
 
 #include <utility>

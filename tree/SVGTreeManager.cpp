@@ -124,6 +124,7 @@ void SVGTreeManager::appendNewGroup(SVGElement* group, bool makeCurrent) {
     if (!canAdd() || !group) {
         return;
     }
+    groupsMayBeEmpty = true;
     if (makeCurrent) {
         currentNode->appendChild(group);
     }

@@ -65,6 +65,7 @@ public:
     SVGGraphicContext* context = nullptr; // borrowed
     bool unlocked = true;
     MoxPtr<SVGElement> defsElement;
+    bool groupsMayBeEmpty = false; ///< whether a clipping group came, which nothing may go into
 
 private:
     bool canAdd() const;

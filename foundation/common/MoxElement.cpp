@@ -13,8 +13,9 @@
 namespace MoxCommonNS {
 namespace {
 
-/// Capacities of 7, 15, 31 and so on fill what the allocator gives to the last byte.
-constexpr std::uint32_t firstCapacity = 7;
+/// Capacities of 3, 7, 15 and so on fill what the allocator gives to the last byte; a group has few
+/// attributes, and the array of a shape grows in place while it is the newest block.
+constexpr std::uint32_t firstCapacity = 3;
 constexpr std::uint32_t maxCapacity = std::numeric_limits<std::uint16_t>::max();
 
 constexpr std::uint32_t nextCapacity(std::uint32_t capacity) {

@@ -3,9 +3,6 @@
 #include "foundation/common/MoxXmlChars.h"
 
 #include <algorithm>
-#include <array>
-#include <atomic>
-#include <bit>
 #include <functional>
 #include <memory>
 #include <mutex>
@@ -61,23 +58,18 @@ bool isPlainName(const UnicodeString& text, const std::string& xmlName) {
     return isText && !isDeclaration(text);
 }
 
-/// All names given out so far. Entries are reached by number without a lock: a slot is published
-/// once and never changes.
-class NameStore {
+} // namespace
+
+/// The way into the table: gives out the numbers, one thread at a time.
+class MoxNameStore {
 public:
-    NameStore() {
+    MoxNameStore() {
         for (const FixedName& fixed : fixedNames) {
             enter(fixed.number, UnicodeString(fixed.text));
         }
         for (const char16_t* text : svgNames) {
             enterSvgName(UnicodeString(text));
         }
-    }
-
-    const MoxNameTable::Entry* find(std::uint32_t number) const {
-        const Place place = placeOf(number);
-        const Slot* slots = blocks[place.block].load(std::memory_order_acquire);
-        return slots ? slots[place.index].load(std::memory_order_acquire) : nullptr;
     }
 
     std::uint32_t intern(const UnicodeString& text) {
@@ -97,22 +89,7 @@ public:
     }
 
 private:
-    using Slot = std::atomic<const MoxNameTable::Entry*>;
-
-    struct Place {
-        std::size_t block;
-        std::size_t index;
-    };
-
-    static constexpr std::uint32_t firstBlockSize = MoxNameTable::firstFreeNumber;
-    static constexpr std::size_t blockCount = 21; // blocks double in size: 2^32 numbers in all
-
-    static Place placeOf(std::uint32_t number) {
-        const std::uint64_t shifted = std::uint64_t{number} + firstBlockSize;
-        const std::size_t top = std::bit_width(shifted) - 1;
-        return {top - (std::bit_width(firstBlockSize) - 1),
-                static_cast<std::size_t>(shifted - (std::uint64_t{1} << top))};
-    }
+    using Slot = MoxNameTable::Slot;
 
     void enterSvgName(const UnicodeString& text) {
         // The number of a name that has a fixed one stays unused, so that all others keep a number
@@ -127,26 +104,29 @@ private:
         auto entry = std::make_unique<MoxNameTable::Entry>();
         entry->text = UnicodeString(text.getBuffer(), text.length());
         entry->xmlName = makeXmlName(text);
+        entry->attributeStart = " " + entry->xmlName + "=\"";
         entry->isPlain = isPlainName(entry->text, entry->xmlName);
-        const Place place = placeOf(number);
-        Slot* slots = blocks[place.block].load(std::memory_order_relaxed);
+        const MoxNameTable::Place place = MoxNameTable::placeOf(number);
+        std::atomic<Slot*>& block = MoxNameTable::blocks[place.block];
+        Slot* slots = block.load(std::memory_order_relaxed);
         if (!slots) {
-            slots = new Slot[std::size_t{firstBlockSize} << place.block]();
-            blocks[place.block].store(slots, std::memory_order_release);
+            slots = new Slot[std::size_t{MoxNameTable::firstFreeNumber} << place.block]();
+            block.store(slots, std::memory_order_release);
         }
         numbers.emplace(viewOf(entry->text), number);
         slots[place.index].store(entry.release(), std::memory_order_release);
     }
 
-    std::array<std::atomic<Slot*>, blockCount> blocks = {}; // owned, for the life of the process
     std::unordered_map<std::u16string_view, std::uint32_t> numbers; // views of the entries' texts
     std::shared_mutex mutex;
     std::uint32_t nextNumber = MoxNameTable::firstFreeNumber;
 };
 
-NameStore& store() {
+namespace {
+
+MoxNameStore& store() {
     // Never destroyed: static objects may still use names while the process ends.
-    static NameStore& theStore = *new NameStore;
+    static MoxNameStore& theStore = *new MoxNameStore;
     return theStore;
 }
 
@@ -157,10 +137,14 @@ const MoxNameTable::Entry& emptyEntry() {
 
 } // namespace
 
+constinit std::array<std::atomic<MoxNameTable::Slot*>, MoxNameTable::blockCount>
+    MoxNameTable::blocks = {};
+
 const UnicodeString& MoxNameTable::getSharedNameString(MoxName name) { return getEntry(name).text; }
 
-const MoxNameTable::Entry& MoxNameTable::getEntry(MoxName name) {
-    const Entry* entry = store().find(name.number);
+const MoxNameTable::Entry& MoxNameTable::findOutside(std::uint32_t number) {
+    store();
+    const Entry* entry = find(number);
     return entry ? *entry : emptyEntry();
 }
 

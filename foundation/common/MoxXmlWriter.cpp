@@ -233,7 +233,9 @@ void MoxXmlWriter::writeAttributes(const MoxElement& element, const std::string&
             writeOddAttributes(element, &attribute, declared);
             return;
         }
-        writeAttribute(entry.xmlName, attribute);
+        sink.write(entry.attributeStart);
+        writeValue(attribute);
+        sink.write('"');
     }
 }
 

@@ -50,6 +50,7 @@ TEST(MoxNameTable, KeepsTextsWhenTheCallersStringChanges) {
 TEST(MoxNameTable, HoldsManyNames) {
     constexpr int count = 50000; // beyond the first three blocks of numbers
     std::vector<MoxName> names;
+    names.reserve(count);
     for (int i = 0; i < count; ++i) {
         names.emplace_back(UnicodeString::fromUTF8("name" + std::to_string(i)));
     }
@@ -63,8 +64,10 @@ TEST(MoxNameTable, FourThreadsAgreeOnEveryNumber) {
     constexpr int count = 5000;
     std::array<std::vector<MoxName>, 4> names;
     std::vector<std::thread> threads;
+    threads.reserve(names.size());
     for (std::vector<MoxName>& own : names) {
         threads.emplace_back([&own] {
+            own.reserve(count);
             for (int i = 0; i < count; ++i) {
                 own.emplace_back(UnicodeString::fromUTF8("shared" + std::to_string(i)));
                 // Reading goes on while others write.

@@ -251,7 +251,7 @@ std::string withoutTrailingZeros(std::string text) {
 
 /// The rule in slow motion: exact digits of the float, rounded by the C library.
 std::string expectedRounding(float value, int decimals) {
-    const std::string shortest = shortestFixed(value);
+    std::string shortest = shortestFixed(value);
     const std::size_t point = shortest.find('.');
     const std::size_t shortestDecimals =
         point == std::string::npos ? 0 : shortest.size() - point - 1;

@@ -49,11 +49,13 @@ TEST_F(MoxPtrTest, ACopyCounts) {
 TEST_F(MoxPtrTest, AMoveDoesNotCountAndLeavesNull) {
     MoxPtr<Probe> moved(std::move(pointer));
     EXPECT_EQ(moved->getReferenceCount(), 1);
-    EXPECT_EQ(pointer, nullptr); // NOLINT(bugprone-use-after-move): that it is null is the claim
+    // NOLINTNEXTLINE(bugprone-use-after-move,clang-analyzer-cplusplus.Move): the claim
+    EXPECT_TRUE(pointer == nullptr);
     MoxPtr<Probe> again;
     again = std::move(moved);
     EXPECT_EQ(again->getReferenceCount(), 1);
-    EXPECT_EQ(moved, nullptr); // NOLINT(bugprone-use-after-move)
+    // NOLINTNEXTLINE(bugprone-use-after-move,clang-analyzer-cplusplus.Move): the claim
+    EXPECT_TRUE(moved == nullptr);
 }
 
 TEST_F(MoxPtrTest, AssigningItsOwnTargetLeavesTheCountUnchanged) {
@@ -83,8 +85,9 @@ TEST_F(MoxPtrTest, NullIsAllowedEverywhere) {
     const MoxPtr<Probe> fromNull(nullptr);
     null = copy;
     null = nullptr;
-    null = std::move(null);
-    null.swap(null);
+    MoxPtr<Probe>& same = null;
+    null = std::move(same);
+    null.swap(same);
     EXPECT_FALSE(null);
     EXPECT_EQ(null, fromNull);
     EXPECT_EQ(null.get(), nullptr);

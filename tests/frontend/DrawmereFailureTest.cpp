@@ -179,16 +179,18 @@ TEST(DrawmereFailure, WhatIsNoErrorOfTheLibraryIsRethrownAtTheEnd) {
     EXPECT_EQ(handler.told, "other\n");
 }
 
-/// Throws once it is armed, whatever it is asked.
+/// A link that throws, once it is armed, when it is asked where it leads.
 class TrapElement : public SVGElement {
 public:
-    using SVGElement::SVGElement;
+    explicit TrapElement(SVGDocument* document) : SVGElement(document) {
+        setName({}, {}, SVGName(SVGName::a));
+    }
 
-    bool isA(std::uint32_t id) const override {
+    const MoxValue& getAttribute(MoxName name) const override {
         if (armed) {
             throw std::out_of_range("trap");
         }
-        return SVGElement::isA(id);
+        return SVGElement::getAttribute(name);
     }
 
     bool armed = false;

@@ -40,6 +40,8 @@ std::string pointOf(float x, float y) {
     return {digits, writeRulePoint(MoxPointT<MoxLength>(pt(x), pt(y)), digits)};
 }
 
+std::string narrowed(const char16_t* begin, const char16_t* end) { return {begin, end}; }
+
 struct DigitsRow {
     float value;
     const char* text;
@@ -147,14 +149,11 @@ TEST(SVGNumberRule, SaysTheSameAroundTheMiddleOfTwoThousandths) {
 
 TEST(SVGNumberRule, WritesTheSameInUtf16) {
     for (const DigitsRow& row : digitsRows) {
+        const MoxPointT<MoxLength> point(pt(row.value), pt(-row.value));
         char16_t digits[maxRulePoint];
-        const char16_t* end = writeRuleDigits(row.value, digits);
-        EXPECT_EQ(std::string(static_cast<const char16_t*>(digits), end), row.text);
-        end = writeRuleNumber(pt(row.value), digits);
-        EXPECT_EQ(std::string(static_cast<const char16_t*>(digits), end), numberOf(pt(row.value)));
-        end = writeRulePoint({pt(row.value), pt(-row.value)}, digits);
-        EXPECT_EQ(std::string(static_cast<const char16_t*>(digits), end),
-                  pointOf(row.value, -row.value));
+        EXPECT_EQ(narrowed(digits, writeRuleDigits(row.value, digits)), row.text);
+        EXPECT_EQ(narrowed(digits, writeRuleNumber(point.x, digits)), numberOf(point.x));
+        EXPECT_EQ(narrowed(digits, writeRulePoint(point, digits)), pointOf(row.value, -row.value));
     }
 }
 
@@ -170,7 +169,10 @@ TEST(SVGNumberRule, ALengthUpToAThousandthOfAMillimetreIsZeroAndHasNoSign) {
         EXPECT_TRUE(isRuleZero(pt(value)));
         EXPECT_EQ(numberOf(pt(value)), "0");
     }
-    // That limit is 0.0028 points, so no longer length rounds to nothing.
+}
+
+TEST(SVGNumberRule, ALongerLengthKeepsADigit) {
+    // The limit is 0.0028 points, so what lies beyond it does not round to nothing.
     EXPECT_EQ(numberOf(pt(std::nextafter(limit, 1.0F))), ".003");
     EXPECT_EQ(numberOf(pt(std::nextafter(-limit, -1.0F))), "-.003");
     EXPECT_FALSE(isRuleZero(pt(std::nextafter(limit, 1.0F))));
