@@ -145,6 +145,10 @@ void DrawmereImpl::initRootSvg() {
 
 void DrawmereImpl::finishRootSvg() {
     fontManager->doEmbedFonts();
+    if (savedGroupManager) {
+        // A path that nobody ended is lost; the group that was open before it is not.
+        closePathManager();
+    }
     groupManager->appendToTree();
     MoxElement* root = treeManager->document->getDocumentElement();
     if (documentIsShown || treeManager->groupsMayBeEmpty) {

@@ -187,6 +187,11 @@ public:
     void setPathQuadraticBezierCurveTo(const MoxPointT<MoxLength>& point1,
                                        const MoxPointT<MoxLength>& point2);
 
+    /// Returns: the value of a position attribute: one number when all positions are the same, all
+    /// of them with blanks between otherwise; empty, for no attribute, when all are 0 or there is
+    /// none.
+    UnicodeString makePositionAttributeString(const std::vector<MoxLength>& positions) const;
+
     /// Places an empty `desc` in the root, behind the `defs` when there is one.
     void setComment();
 
@@ -211,6 +216,11 @@ protected:
 
 private:
     void finishShape(SVGElement* element, PAINTMODE mode);
+    void closePathManager();
+    void setPosition(SVGElement& element, SVGName name,
+                     const std::vector<MoxLength>& positions) const;
+    void handOverFont();
+    void registerText(const UnicodeString& text, TLStringWithGlyphInfo* glyphs, bool wholeRun);
     void setViewBox(SVGElement* root, MoxLength width, MoxLength height) const;
     void setFillAttr(SVGElement& element, const GraphicContext& state, PAINTMODE mode) const;
 
