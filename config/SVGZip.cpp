@@ -15,6 +15,11 @@ constexpr int gzipWindowBits = 15 + 16; // the largest window, and a gzip header
 constexpr int highestMemoryLevel = 9;
 
 std::ostream* openFile(const UnicodeString& fileName) {
+    if (fileName.indexOf(u'\0') >= 0) { // it would end the path early and name some other file
+        auto* const closed = new std::ofstream;
+        closed->setstate(std::ios::failbit);
+        return closed;
+    }
     return new std::ofstream(MoxCommonNS::MoxCStr(fileName).toCStr(),
                              std::ios::out | std::ios::binary | std::ios::trunc);
 }

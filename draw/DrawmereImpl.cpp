@@ -151,7 +151,7 @@ void DrawmereImpl::finishRootSvg() {
     }
     groupManager->appendToTree();
     MoxElement* root = treeManager->document->getDocumentElement();
-    if (documentIsShown || treeManager->groupsMayBeEmpty) {
+    if (wantsWalk || treeManager->groupsMayBeEmpty) {
         SVGOptimizer::optimize(root);
     }
     if (config->svgType == SVGConfig::SVGTYPE_TINY && config->wispMode) {
@@ -160,7 +160,7 @@ void DrawmereImpl::finishRootSvg() {
 }
 
 SVGDocument* DrawmereImpl::getDocument() {
-    documentIsShown = true;
+    wantsWalk = true;
     return treeManager->document.get();
 }
 

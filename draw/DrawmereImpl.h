@@ -166,7 +166,11 @@ public:
     SVGDocument* getDocument();
 
     /// Returns: whether the document may hold links; false is certain.
-    bool mayHoldLinks() const { return hasLinks || documentIsShown; }
+    bool mayHoldLinks() const { return hasLinks || wantsWalk; }
+
+    /// Returns: the anchors that were made with the mark of a page, in the order they were made;
+    /// some may have found no place in the tree.
+    const std::vector<MoxPtr<MoxElement>>& getPageAnchors() const { return pageAnchors; }
 
     /// Returns: the state that setters change now, borrowed; while a path is open that is a state
     /// of the path's own, which is thrown away with it.
@@ -225,7 +229,9 @@ private:
     void setFillAttr(SVGElement& element, const GraphicContext& state, PAINTMODE mode) const;
 
     bool hasLinks = false;
-    bool documentIsShown = false;
+    bool wantsWalk =
+        false; ///< the tree may have been changed by others, or an anchor stand elsewhere
+    std::vector<MoxPtr<MoxElement>> pageAnchors;
 };
 
 } // namespace DrawmereNS

@@ -1,6 +1,8 @@
 // Links and their destinations.
 #include "draw/DrawmereImpl.h"
 #include "foundation/common/MoxNameTable.h"
+#include "refs/SVGReferenceId.h"
+#include "tree/SVGTreeManager.h"
 
 namespace DrawmereNS {
 namespace {
@@ -44,6 +46,11 @@ void DrawmereImpl::setInternalLinkAnchor(UnicodeString id, float /*x*/, float y)
     group->setSVGAttribute(SVGName::transform, translation);
     const MoxPtr<SVGElement> anchor = createElement(SVGName::text);
     anchor->setSVGAttribute(SVGName::id, id);
+    if (SVGReferenceId::isPageReferenceId(id)) {
+        pageAnchors.emplace_back(anchor.get());
+        // A saved cursor may mean a definition, which stands before all that was drawn so far.
+        wantsWalk = wantsWalk || !treeManager->nodeStack.empty();
+    }
     group->appendChild(anchor.get());
     addElement(group.get(), /*direct=*/false, /*makeCurrent=*/false);
 }

@@ -178,19 +178,29 @@ void Drawmere::finishOpenDocument() {
     impl->finishRootSvg();
     const MoxPtr<MoxDocument> document(impl->treeManager->document.get());
     if (config->streamOutput || config->singleFile) {
-        documents.emplace(currentPage, document);
-        closeImpl();
-        return;
+        keepDocument(document);
+    } else if (isSolved(document->getDocumentElement())) {
+        writeFile(document.get(), makePagePath(currentPage));
+    } else {
+        keepDocument(document);
+    }
+    closeImpl();
+}
+
+bool Drawmere::isSolved(MoxCommonNS::MoxElement* root) const {
+    if (!impl->mayHoldLinks()) {
+        return true;
     }
     SVGReferenceId references;
     references.setRefernceIdInfo(/*isSingleFile=*/false, allAnchors, anchorPages, pageFiles);
-    if (!impl->mayHoldLinks() ||
-        references.isSolvedReferenceId(currentPage, document->getDocumentElement())) {
-        writeFile(document.get(), makePagePath(currentPage));
-    } else {
-        documents.emplace(currentPage, document);
+    return references.isSolvedReferenceId(currentPage, root);
+}
+
+void Drawmere::keepDocument(const MoxPtr<MoxDocument>& document) {
+    const bool isKept = documents.emplace(currentPage, document).second;
+    if (isKept && !impl->mayHoldLinks()) {
+        linklessAnchors[currentPage] = impl->getPageAnchors();
     }
-    closeImpl();
 }
 
 void Drawmere::writeFile(MoxDocument* document, const UnicodeString& path) {
@@ -204,6 +214,7 @@ void Drawmere::writeFile(MoxDocument* document, const UnicodeString& path) {
     if (!written) {
         DrawmereError::throwError(16414, path);
     }
+    hasWrittenFile = true;
 }
 
 bool Drawmere::hasError() { return config->hasError(); }

@@ -23,6 +23,13 @@ UnicodeString toDestination(const MoxValue& value) {
     return isText ? value.toString() : UnicodeString();
 }
 
+bool standsIn(const MoxDocument& document, const MoxCommonNS::MoxNode* node) {
+    while (node && node != &document) {
+        node = node->parentLink();
+    }
+    return node != nullptr;
+}
+
 constexpr MoxNameEnum destinationKeys[] = {
     MoxCommonNS::MOXNAME_ID,
     MoxCommonNS::MOXNAME_NAME,
@@ -82,7 +89,8 @@ void Drawmere::finishRun() {
             writeFile(first, outputPath);
         }
     }
-    if (!oneDocument && pageCount == 1 && !config->keepPageNumber) {
+    // A page that could not be written must not take the place of an older file.
+    if (!oneDocument && pageCount == 1 && hasWrittenFile && !config->keepPageNumber) {
         renameOnlyPage();
     }
 }
@@ -91,7 +99,16 @@ void Drawmere::solveReferences() {
     SVGReferenceId references;
     references.setRefernceIdInfo(config->singleFile, allAnchors, anchorPages, pageFiles);
     for (const auto& [page, document] : documents) {
-        references.solveReferenceId(page, document->getDocumentElement());
+        const auto anchors = linklessAnchors.find(page);
+        if (anchors == linklessAnchors.end()) {
+            references.solveReferenceId(page, document->getDocumentElement());
+            continue;
+        }
+        for (const auto& anchor : anchors->second) {
+            if (standsIn(*document, anchor.get())) {
+                references.solvePageAnchor(anchor.get());
+            }
+        }
     }
 }
 
@@ -114,11 +131,14 @@ void Drawmere::writeStream(MoxDocument* document) {
 }
 
 void Drawmere::renameOnlyPage() const {
-    MoxCommonNS::MoxCStr numbered(makePagePath(firstPage));
+    const UnicodeString& plain = pageUri->getText();
+    if (plain.indexOf(u'\0') >= 0) {
+        return; // it would end the path early and name some other file
+    }
     // On purpose: the text of the URI as the caller gave it, so a "file:" URI names no file here.
-    MoxCommonNS::MoxCStr plain(pageUri->getText());
     // A file that can't be renamed keeps its number.
-    static_cast<void>(std::rename(numbered.toCStr(), plain.toCStr()));
+    static_cast<void>(std::rename(MoxCommonNS::MoxCStr(makePagePath(firstPage)).toCStr(),
+                                  MoxCommonNS::MoxCStr(plain).toCStr()));
 }
 
 void Drawmere::startLink(const MoxValue& link) {

@@ -69,7 +69,8 @@ using TalGraphic::TLGraphicType;
 /// two threads at once.
 class DRAWMERE_API Drawmere {
 public:
-    /// Borrows: both, for the life of the object, in which the caller may go on setting options.
+    /// Borrows: both, for the life of the object, in which the caller may go on setting options;
+    /// neither may be null.
     Drawmere(SVGConfig* config, SVGPageUri* uri);
     Drawmere(const Drawmere&) = delete;
     Drawmere& operator=(const Drawmere&) = delete;
@@ -103,7 +104,8 @@ public:
     void finishRootSvg();
 
     /// Ends the run: solves the links between kept documents and writes them.
-    /// Failures go to the error handler and end the run; what was written stays.
+    /// Failures go to the error handler and end the run; what was written stays. The caller's
+    /// stream is neither flushed nor closed, so what it refuses only then is for the caller to see.
     void finish();
 
     /// Writes `document` to `stream`, compressed when the configuration says so. Failures stay in
@@ -265,11 +267,12 @@ public:
     std::int32_t currentPage = 0;
     std::int32_t firstPage = 0;
     std::int32_t pageCount = 0;
-    std::set<UnicodeString> pageAnchors;                   // of the page in progress
-    std::set<UnicodeString> allAnchors;                    // of every ended page
-    std::map<UnicodeString, std::int32_t> anchorPages;     // the first page to define each
-    std::map<std::int32_t, UnicodeString> pageFiles;       // names without directory
-    std::map<std::int32_t, MoxPtr<MoxDocument>> documents; // kept for `finish`
+    std::set<UnicodeString> pageAnchors;               // of the page in progress
+    std::set<UnicodeString> allAnchors;                // of every ended page
+    std::map<UnicodeString, std::int32_t> anchorPages; // the first page to define each
+    std::map<std::int32_t, UnicodeString> pageFiles;   // names without directory
+    /// Kept for `finish`. One in which the library made no link is taken to have none.
+    std::map<std::int32_t, MoxPtr<MoxDocument>> documents;
 
 private:
     void openImpl();
@@ -280,11 +283,17 @@ private:
     UnicodeString makePagePath(std::int32_t page) const;
     void writeFile(MoxDocument* document, const UnicodeString& path);
     void finishOpenDocument();
+    bool isSolved(MoxCommonNS::MoxElement* root) const;
+    void keepDocument(const MoxPtr<MoxDocument>& document);
     void finishRun();
     void solveReferences();
     void writeKeptDocuments();
     void writeStream(MoxDocument* document);
     void renameOnlyPage() const;
+
+    bool hasWrittenFile = false;
+    /// The page anchors of kept documents without links, which need not be searched for.
+    std::map<std::int32_t, std::vector<MoxPtr<MoxCommonNS::MoxElement>>> linklessAnchors;
 };
 
 } // namespace DrawmereNS

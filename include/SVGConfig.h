@@ -184,7 +184,9 @@ public:
     UnicodeString imageBaseUri;             ///< base of references to images, bogus by default
     /// Where copied images go, "./" by default; relative to the directory of `svgOutputUri`.
     UnicodeString imageCopyUri;
-    /// True, the default: the document goes to the caller's stream. For files set it to false.
+    /// True, the default: the document goes to the caller's stream. For files set it to false. A
+    /// document of several pages wants `singleFile` here too: links between its pages lead to the
+    /// files of these pages otherwise.
     bool streamOutput = false;
     bool checkPaths = false;        ///< test output and copy paths, false by default
     UnicodeString svgOutputUri;     ///< the document's own URI, bogus by default

@@ -140,6 +140,15 @@ void SVGReferenceId::solveReferenceId(int, MoxElement* element) {
     }
 }
 
+void SVGReferenceId::solvePageAnchor(MoxElement* text) {
+    const MoxName idName(MoxCommonNS::MOXNAME_ID);
+    const UnicodeString id = text ? getAttributeText(*text, idName) : UnicodeString();
+    if (isPageReferenceId(id)) {
+        currentPage = getReferencePageNo(id);
+        text->setAttribute(idName, getInternalPageRefernceId(id));
+    }
+}
+
 void SVGReferenceId::setRefernceIdInfo(bool isSingleFile, const std::set<UnicodeString>& anchors,
                                        const std::map<UnicodeString, int>& pagesOfAnchors,
                                        const std::map<int, UnicodeString>& filesOfPages) {
@@ -179,23 +188,13 @@ bool SVGReferenceId::solveLink(MoxElement& link) const {
     return true;
 }
 
-/// Gives the anchor of a page its final id; any other text stays as it is.
-void SVGReferenceId::solveAnchor(MoxElement& text) {
-    const MoxName idName(MoxCommonNS::MOXNAME_ID);
-    const UnicodeString id = getAttributeText(text, idName);
-    if (isPageReferenceId(id)) {
-        currentPage = getReferencePageNo(id);
-        text.setAttribute(idName, getInternalPageRefernceId(id));
-    }
-}
-
 /// Returns: whether the children of the element are to be solved too.
 bool SVGReferenceId::solveElement(MoxElement& element) {
     if (isNamed(element, SVGName::a)) {
         return solveLink(element);
     }
     if (isNamed(element, SVGName::text)) {
-        solveAnchor(element);
+        solvePageAnchor(&element);
     }
     return true;
 }

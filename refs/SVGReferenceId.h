@@ -54,6 +54,10 @@ public:
     /// Ignores: `page`, and a null element.
     void solveReferenceId(int page, MoxElement* element);
 
+    /// Gives the `text` that is the anchor of a page its final id, and makes that page the current
+    /// one. Ignores: any other text, and a null.
+    void solvePageAnchor(MoxElement* text);
+
     /// Sets what links are solved with: whether all pages are in one document, the ids of all
     /// destinations, the page of each, and the file name of each page.
     /// Borrows: the containers, which must outlive this object and may go on to grow.
@@ -71,7 +75,6 @@ private:
     const int* findPage(const UnicodeString& reference) const;
     const UnicodeString* findFile(int page) const;
     bool solveLink(MoxElement& link) const;
-    void solveAnchor(MoxElement& text);
     bool solveElement(MoxElement& element);
 };
 

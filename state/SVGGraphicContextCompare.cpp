@@ -4,6 +4,9 @@
 #include "state/SVGGraphicContext.h"
 #include "tree/SVGUtil.h"
 
+#include <algorithm>
+#include <string_view>
+
 namespace DrawmereNS {
 namespace {
 
@@ -37,11 +40,20 @@ MoxElement* findRoot(const SVGElement& element) {
     return document ? narrow<MoxElement>(document->getFirstChild()) : nullptr;
 }
 
+/// Compared in place: most families are longer than what a value keeps without the heap.
+bool saysText(const MoxValue& value, std::u16string_view text) {
+    if (value.isWideText()) {
+        return value.getWideText() == text;
+    }
+    const std::string_view bytes = value.getAsciiText();
+    return std::equal(bytes.begin(), bytes.end(), text.begin(), text.end());
+}
+
 /// Whether the root's font-family, a text or a name, says `family`; any other value says nothing.
 bool saysFamily(const MoxValue& value, const UnicodeString& family) {
     switch (value.getType()) {
     case MoxValueType::MOXVALUE_STRING:
-        return value == MoxValue(family);
+        return saysText(value, viewOf(family));
     case MoxValueType::MOXVALUE_NAME:
         return MoxNameTable::getSharedNameString(value.getNameValue()) == family;
     default:

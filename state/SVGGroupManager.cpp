@@ -53,6 +53,8 @@ void SVGGroupManager::setScale(float /*scale*/) {}
 
 float SVGGroupManager::getScale() const { return naturalScale; }
 
+MoxValue SVGGroupManager::takePathData() { return {}; }
+
 void SVGGroupManager::addElement(SVGElement* element) {
     if (pathLock || !element) {
         return;

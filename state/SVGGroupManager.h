@@ -5,6 +5,7 @@
 #include "SVGFont.h"
 #include "foundation/common/MoxPtr.h"
 #include "foundation/common/MoxString.h"
+#include "foundation/common/MoxValue.h"
 
 namespace MoxCommonNS {
 class MoxElement;
@@ -14,6 +15,7 @@ namespace DrawmereNS {
 
 using MoxCommonNS::MoxElement;
 using MoxCommonNS::MoxPtr;
+using MoxCommonNS::MoxValue;
 
 class SVGConfig;
 class SVGDrawElement;
@@ -60,6 +62,10 @@ public:
     virtual void setScale(float scale);
     /// Returns: the scale in force, 1 where none is kept.
     virtual float getScale() const;
+
+    /// Returns: the path data as the value of an attribute, null where there is none; what was
+    /// collected is gone then.
+    virtual MoxValue takePathData();
 
     /// Appends `element` to the open group, opening one when there is none, and writes on it what
     /// differs from the group.

@@ -163,7 +163,7 @@ void SVGTreeManager::push(ELEMENT_TYPE type, SVGGraphicContext* newContext) {
         return;
     }
     if (const CursorRule* rule = findRule(type)) {
-        nodeStack.push_back(currentNode.get());
+        nodeStack.emplace_back(currentNode);
         MoxElement* root = document->getDocumentElement();
         if (rule->destination == Destination::defs) {
             findDefs(root);
@@ -185,7 +185,7 @@ void SVGTreeManager::pop(ELEMENT_TYPE type, SVGFont* font) {
         if (type == ELEMENT_TYPE_GRADIENT) {
             defuseStopLock();
         }
-        currentNode = narrow<SVGElement>(nodeStack.back());
+        currentNode = narrow<SVGElement>(nodeStack.back().get());
         nodeStack.pop_back();
     }
     if (fontStack.empty()) {

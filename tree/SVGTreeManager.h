@@ -58,9 +58,10 @@ public:
     /// Returns: the element that receives the next one, borrowed; null before there is a root.
     SVGElement* getCurrentNode() const { return currentNode.get(); }
 
+    /// Who changes its tree from outside asks for it by `DrawmereImpl::getDocument`.
     MoxPtr<SVGDocument> document;
     MoxPtr<SVGElement> currentNode;
-    std::deque<MoxElement*> nodeStack; // borrowed; the tree keeps them
+    std::deque<MoxPtr<MoxElement>> nodeStack; // kept, as callers may take them out of the tree
     std::deque<SVGFont> fontStack;
     SVGGraphicContext* context = nullptr; // borrowed
     bool unlocked = true;

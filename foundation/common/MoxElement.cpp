@@ -2,10 +2,11 @@
 
 #include "foundation/common/MoxDocument.h"
 #include "foundation/common/MoxNameTable.h"
+#include "foundation/common/MoxNodeHeap.h"
 #include "foundation/common/MoxXmlUtil.h"
 
 #include <algorithm>
-#include <cstdlib>
+#include <cstring>
 #include <limits>
 #include <memory>
 #include <new>
@@ -13,16 +14,9 @@
 namespace MoxCommonNS {
 namespace {
 
-/// Capacities of 3, 7, 15 and so on fill what the allocator gives to the last byte; a group has few
-/// attributes, and the array of a shape grows in place while it is the newest block.
-constexpr std::uint32_t firstCapacity = 3;
 constexpr std::uint32_t maxCapacity = std::numeric_limits<std::uint16_t>::max();
 
-constexpr std::uint32_t nextCapacity(std::uint32_t capacity) {
-    return capacity ? capacity * 2 + 1 : firstCapacity;
-}
-
-static_assert(nextCapacity(0x7FFF) == maxCapacity);
+constexpr std::size_t sizeOf(std::uint32_t capacity) { return capacity * sizeof(MoxValue); }
 
 /// The prefix that `attribute` declares for the namespace with the text `uri`, 0 when it is no
 /// declaration of that.
@@ -39,7 +33,7 @@ MoxElement::MoxElement(MoxDocument* document) : MoxNode(MOXNODE_ELEMENT, documen
 
 MoxElement::~MoxElement() {
     std::destroy_n(attributes, attributeCount);
-    std::free(attributes);
+    MoxNodeHeap::release(attributes, sizeOf(attributeCapacity));
 }
 
 std::uint32_t MoxElement::getTypeID() const { return typeId; }
@@ -133,18 +127,30 @@ MoxValue* MoxElement::find(MoxName name) const {
     return nullptr;
 }
 
+/// Makes room for one attribute where the array stands, or for as many again elsewhere.
+void MoxElement::grow() {
+    if (attributeCapacity == maxCapacity) {
+        throw std::bad_alloc();
+    }
+    const std::size_t size = sizeOf(attributeCapacity);
+    if (MoxNodeHeap::growInPlace(attributes, size, size + sizeof(MoxValue))) {
+        ++attributeCapacity;
+        return;
+    }
+    const std::uint32_t capacity = std::clamp(2U * attributeCapacity, 1U, maxCapacity);
+    void* memory = MoxNodeHeap::allocate(sizeOf(capacity));
+    if (attributes) {
+        // Values hold no pointers into themselves, so they may move as plain bytes.
+        std::memcpy(memory, static_cast<void*>(attributes), size);
+        MoxNodeHeap::release(attributes, size);
+    }
+    attributes = static_cast<MoxValue*>(memory);
+    attributeCapacity = static_cast<std::uint16_t>(capacity);
+}
+
 MoxValue* MoxElement::append() {
     if (attributeCount == attributeCapacity) {
-        const std::uint32_t capacity = nextCapacity(attributeCapacity);
-        // Values hold no pointers into themselves, so they may move as plain bytes.
-        void* memory = capacity <= maxCapacity ? std::realloc(static_cast<void*>(attributes),
-                                                              capacity * sizeof(MoxValue))
-                                               : nullptr;
-        if (!memory) {
-            throw std::bad_alloc();
-        }
-        attributes = static_cast<MoxValue*>(memory);
-        attributeCapacity = static_cast<std::uint16_t>(capacity);
+        grow();
     }
     MoxValue* place = new (attributes + attributeCount) MoxValue;
     ++attributeCount;

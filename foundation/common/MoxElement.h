@@ -5,7 +5,8 @@
 
 namespace MoxCommonNS {
 
-/// An element: a name, attributes in the order of first setting, and children.
+/// An element: a name, attributes in the order of first setting, and children. It has room for
+/// 65,535 attributes; one more throws std::bad_alloc and changes nothing.
 class DRAWMERE_API MoxElement : public MoxNode {
 public:
     static constexpr std::uint32_t typeId = 0x9B60777D;
@@ -61,6 +62,7 @@ protected:
 private:
     MoxValue* find(MoxName name) const;
     MoxValue* append();
+    void grow();
 
     MoxName uri;
     MoxName prefix;

@@ -63,7 +63,7 @@ MoxNode* MoxNode::insertBefore(MoxNode* child, MoxNode* ref) {
 }
 
 void MoxNode::replaceChild(MoxNode* child, MoxNode* old) {
-    if (!old || old->parent != this || child == old) {
+    if (!child || !old || old->parent != this || child == old) {
         return;
     }
     // The old child goes first, so that a document may exchange its one root.

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "foundation/common/MoxAttributeMap.h"
+#include "foundation/common/MoxNodeHeap.h"
 #include "foundation/common/MoxNodeIterable.h"
 #include "foundation/common/MoxPtr.h"
 
@@ -26,6 +27,12 @@ public:
 
     /// Lets go of all children.
     ~MoxNode() override;
+
+    // Nodes stand in the memory of trees.
+    static void* operator new(std::size_t size) { return MoxNodeHeap::allocate(size); }
+
+    static void operator delete(void* node, std::size_t size) { MoxNodeHeap::release(node, size); }
+
     std::uint32_t getTypeID() const override;
     bool isA(std::uint32_t id) const override;
     const char* getTypeName() const override;

@@ -14,6 +14,7 @@
 #include <limits>
 #include <new>
 #include <string>
+#include <type_traits>
 
 namespace MoxCommonNS {
 
@@ -39,10 +40,11 @@ const MoxNamedValueMap& emptyMap() {
     return map;
 }
 
-bool isAscii(std::u16string_view text) {
-    char16_t seen = 0;
-    for (const char16_t unit : text) {
-        seen = static_cast<char16_t>(seen | unit);
+/// Looks at all units: a loop without a way out takes many at once.
+template <typename Unit> bool isAscii(std::basic_string_view<Unit> text) {
+    std::make_unsigned_t<Unit> seen = 0;
+    for (const Unit unit : text) {
+        seen = static_cast<std::make_unsigned_t<Unit>>(seen | unit);
     }
     return seen < 0x80;
 }
@@ -128,9 +130,7 @@ MoxValue::MoxValue(const MoxNamedValueMap& map) {
 }
 
 MoxValue MoxValue::fromAscii(std::string_view text) {
-    const bool ascii = std::all_of(text.begin(), text.end(),
-                                   [](char c) { return static_cast<unsigned char>(c) < 0x80; });
-    if (!ascii) {
+    if (!isAscii(text)) {
         return {fromBytes(text.data(), text.size())};
     }
     MoxValue result;

@@ -14,10 +14,9 @@ namespace TalCommon {
 /// It is distinct from `MoxName`, which numbers every name there is, and converts to it and back by
 /// table, without a look at the text. A hyphen of the name is an underscore here (`clip_path`
 /// beside `clipPath`), and a word that C++ keeps for itself ends in one (`class_`). Names with a
-/// prefix
-/// ("xlink:href") have no number; they are plain `MoxName`s.
+/// prefix ("xlink:href") have no number; they are plain `MoxName`s.
 class DRAWMERE_API SVGName {
-  public:
+public:
     /// The numbers; 0 is no name of SVG. Callers may pass any number.
     enum Number : std::uint16_t {
         unknown,
@@ -44,7 +43,7 @@ class DRAWMERE_API SVGName {
 
     constexpr Number getNumber() const { return number; }
 
-  private:
+private:
     Number number = unknown;
 };
 

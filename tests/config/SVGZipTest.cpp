@@ -144,6 +144,18 @@ TEST(SVGZip, FileThatCannotBeOpenedSwallowsEverything) {
     EXPECT_FALSE(dir.has("missing"));
 }
 
+TEST(SVGZip, FileNameWithANullCharacterEmptiesNoOtherFile) {
+    const TempDir dir;
+    dir.write("a", "kept");
+    {
+        SVGZipStream stream(dir.uri("a") + UnicodeString(u'\0') + u".svgz");
+        EXPECT_TRUE(stream.fail());
+        stream.clear();
+        stream << "lost";
+    }
+    EXPECT_EQ(dir.read("a"), "kept");
+}
+
 // On purpose: the end-of-file value is a byte like others and stores 255.
 TEST(SVGZip, OverflowWithTheEndOfFileValueStoresAByte) {
     std::ostringstream target;

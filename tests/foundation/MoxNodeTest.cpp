@@ -271,6 +271,7 @@ TEST_F(MoxNodeTest, ReplaceChildLeavesTheTreeWhereItRefuses) {
     const MoxPtr<MoxText> text(new MoxText(document.get(), u"x"));
     a->appendChild(b.get());
     root->replaceChild(nullptr, a.get());
+    root->replaceChild(nullptr, c.get()); // the last one, which has no node behind it
     root->replaceChild(node.get(), nullptr);
     root->replaceChild(node.get(), b.get());
     root->replaceChild(root.get(), a.get());

@@ -1,4 +1,5 @@
 // Finishing documents and runs: what is written when, under which name, and what fails how.
+#include "draw/DrawmereImpl.h"
 #include "tests/frontend/RunFiles.h"
 #include "tests/support/Gunzip.h"
 
@@ -68,6 +69,27 @@ TEST(DrawmereFinish, ARenamingThatFailsLeavesTheNumberAndSaysNothing) {
     run.drawPage(1);
     EXPECT_EQ(errorOf([&run] { run.drawmere.finish(); }), "");
     EXPECT_TRUE(run.holdsPage("out1.svg", 1));
+}
+
+TEST(DrawmereFinish, APageThatCouldNotBeWrittenTakesNoOlderFilesPlace) {
+    RunFiles run;
+    RememberingHandler handler;
+    std::ofstream(run.directory.path("out.svg")) << "older";
+    fs::create_symlink("/dev/full", run.directory.path("out1.svg"));
+    run.drawmere.setErrorHandler(&handler);
+    run.drawPage(1);
+    run.drawmere.finish();
+    EXPECT_EQ(handler.told.substr(0, 5), "16414");
+    EXPECT_EQ(run.directory.read("out.svg"), "older");
+    EXPECT_TRUE(fs::is_symlink(run.directory.path("out1.svg")));
+}
+
+TEST(DrawmereFinish, APlainNameWithANullCharacterIsNotRenamedTo) {
+    RunFiles run;
+    run.drawPage(1);
+    run.uri.setText(run.directory.uri("ou") + UnicodeString(u'\0') + u"t.svg");
+    run.drawmere.finish();
+    EXPECT_EQ(run.list(), "out1.svg");
 }
 
 TEST(DrawmereFinish, APageOfAFileUriIsWrittenAndKeepsItsNumber) {
@@ -156,6 +178,65 @@ TEST(DrawmereFinish, ASingleFileHoldsAllPagesUnderItsOwnName) {
     EXPECT_TRUE(run.config.streamsByName.empty());
 }
 
+std::string finishSingleFile(RunFiles& run) {
+    run.drawmere.finishRootSvg();
+    run.drawmere.finish();
+    return run.directory.read("out.svg");
+}
+
+TEST(DrawmereFinish, PagesWithoutLinksGetTheFinalIdsOfTheirAnchorsToo) {
+    RunFiles run;
+    run.config.singleFile = true;
+    run.open();
+    run.begin(1);
+    run.drawmere.endPage();
+    run.drawmere.pushState();
+    run.begin(2);
+    run.drawmere.popState();
+    run.drawmere.endPage();
+    const std::string text = finishSingleFile(run);
+    EXPECT_NE(text.find("id=\"p1\""), std::string::npos);
+    EXPECT_NE(text.find("id=\"p2\""), std::string::npos);
+    EXPECT_EQ(text.find("Mox-SVG-page-"), std::string::npos);
+}
+
+TEST(DrawmereFinish, AnAnchorWithTheMarkOfAPageIsAPageAnchorToo) {
+    RunFiles run;
+    run.config.singleFile = true;
+    run.open();
+    run.begin(1);
+    run.drawmere.setInternalLinkAnchor(u"Mox-SVG-page-7", 0, 0);
+    run.drawmere.endPage();
+    EXPECT_NE(finishSingleFile(run).find("id=\"p7\""), std::string::npos);
+}
+
+TEST(DrawmereFinish, AnAnchorThatReachedNoTreeChangesNothing) {
+    RunFiles run;
+    run.config.singleFile = true;
+    run.open();
+    run.begin(1);
+    run.drawmere.startPathData();
+    run.drawmere.setInternalLinkAnchor(u"Mox-SVG-page-7", 0, 0);
+    run.drawmere.endPathData(PAINTMODE_FILL);
+    run.drawmere.endPage();
+    const std::string text = finishSingleFile(run);
+    EXPECT_EQ(text.find("p7"), std::string::npos);
+    EXPECT_NE(text.find("id=\"p1\""), std::string::npos);
+}
+
+TEST(DrawmereFinish, ALinkThatACallerHangsIntoTheTreeIsFoundToo) {
+    RunFiles run;
+    run.open();
+    run.begin(1);
+    SVGDocument* document = run.drawmere.impl->getDocument();
+    const MoxPtr<SVGElement> link = document->createSVGElement(SVGName::a);
+    link->setAttribute(MoxName(u"xlink:href"), MoxValue(u"#later"));
+    document->getDocumentElement()->appendChild(link.get());
+    run.drawmere.endPage();
+    run.drawmere.finishRootSvg();
+    EXPECT_EQ(run.drawmere.documents.size(), 1U);
+}
+
 TEST(DrawmereFinish, ASingleFileOfOnePageIsNotRenamed) {
     RunFiles run;
     run.config.singleFile = true;
@@ -200,6 +281,27 @@ TEST(DrawmereFinish, AStreamGetsOneDocumentAndStaysTheCallers) {
     EXPECT_EQ(run.list(), ""); // nothing is renamed either
     stream << "more";
     EXPECT_TRUE(stream.str().ends_with("more"));
+}
+
+TEST(DrawmereFinish, LinksBetweenPagesOfAStreamStayInTheDocumentWithTheSingleFileFlagAlone) {
+    for (const bool singleFile : {false, true}) {
+        RunFiles run;
+        std::ostringstream stream;
+        run.config.streamOutput = true;
+        run.config.singleFile = singleFile;
+        run.drawmere.initRootSvg(&stream);
+        run.begin(1);
+        run.drawmere.setInternalLinkAnchor(u"there", 0, 0);
+        run.drawmere.endPage();
+        run.begin(2);
+        run.drawmere.startLink(u"#there", MoxName());
+        run.drawmere.endLink();
+        run.drawmere.endPage();
+        run.drawmere.finishRootSvg();
+        run.drawmere.finish();
+        const char* const link = singleFile ? "xlink:href=\"#there\"" : "xlink:href=\"out1.svg\"";
+        EXPECT_NE(stream.str().find(link), std::string::npos) << stream.str();
+    }
 }
 
 TEST(DrawmereFinish, AStreamGetsTheFirstOfTwoDocuments) {

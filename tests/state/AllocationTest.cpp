@@ -30,7 +30,7 @@ const UnicodeString& id21() {
 
 SVGFont makeFont(const UnicodeString& name) {
     SVGFont font;
-    font.setFontAttribute(name, pt(12), FONTWEIGHT_BOLD, FSTYLE_ITALIC, UnicodeString(), true);
+    font.setFontAttribute(name, pt(12), FONTWEIGHT_BOLD, FSTYLE_ITALIC, UnicodeString(), false);
     return font;
 }
 
@@ -76,9 +76,12 @@ TEST(Allocation, ASetterAsksTheHeapForNothing) {
 
 TEST(Allocation, AFontIsSetWithoutTheHeap) {
     SvgPage page;
+    SVGFont other = makeFont(id21());
     SVGFont font = makeFont(text27());
-    page->setFont(&font, nullptr);
+    page->setFont(&other, nullptr);
     const AllocationCounter counter;
+    page->setFont(&font, nullptr);
+    EXPECT_EQ(0U, counter.getCount());
     page->setFont(&font, nullptr);
     EXPECT_EQ(0U, counter.getCount());
 }
@@ -105,6 +108,17 @@ TEST(Allocation, APushMakesOneContext) {
     // The stacks themselves grow by blocks of at least 32 entries.
     EXPECT_GE(counter.getCount(), pushes);
     EXPECT_LE(counter.getCount(), pushes + pushes / 16);
+}
+
+TEST(Allocation, APushOfACallerMakesOneContextToo) {
+    SvgPage page;
+    constexpr std::size_t pushes = 1000;
+    const AllocationCounter counter;
+    for (std::size_t i = 0; i < pushes; ++i) {
+        page->pushState();
+    }
+    EXPECT_GE(counter.getCount(), pushes);
+    EXPECT_LE(counter.getCount(), pushes + pushes / 2); // the stack of fonts grows by threes
 }
 
 TEST(Allocation, APushBehindAPopMakesNoMoreThanAContext) {
@@ -145,6 +159,43 @@ TEST_P(Comparison, CopiesNothing) {
     const AllocationCounter counter;
     context.AttrValueCompare(element.get(), /*isGroup=*/false, GetParam());
     EXPECT_EQ(0U, counter.getCount());
+}
+
+TEST(Allocation, ComparisonOfAGroupCopiesNothing) {
+    SVGConfig config;
+    SVGGraphicContext context(&config);
+    setLongTexts(context.currentGC);
+    setLongTexts(context.groupGC);
+    context.groupGC.maskReference = u"none"; // a mask and a pattern would be written
+    context.groupGC.dashArray.clear();
+    context.groupGC.miterLimit = 7;
+    const MoxPtr<SVGDocument> document(new SVGDocument);
+    const MoxPtr<SVGElement> group = document->createSVGElement(SVGName::g);
+    for (const ELEMENTTYPE kind : {ELEMENTTYPE_SHAPE, ELEMENTTYPE_IMAGE, ELEMENTTYPE_TEXT}) {
+        context.setGroupAttrs(group.get(), kind);
+        const AllocationCounter counter;
+        context.setGroupAttrs(group.get(), kind);
+        EXPECT_EQ(0U, counter.getCount()) << kind;
+    }
+}
+
+TEST(Allocation, ComparisonOfALongFamilyWithThatOfTheRootCopiesNothing) {
+    SVGConfig config;
+    SVGTreeManager tree;
+    tree.setSVGDocProp(u"1.1", &config);
+    SVGGraphicContext context(&config);
+    const MoxPtr<SVGElement> group = tree.document->createSVGElement(SVGName::g);
+    group->appendChild(tree.document->createSVGElement(SVGName::text).get());
+    for (const char16_t unit : {u'x', u'\u00E9'}) { // kept as bytes, and not
+        context.groupGC.font = makeFont(UnicodeString(40, unit, 40));
+        tree.document->getDocumentElement()->setAttribute(
+            SVGName(SVGName::font_family), MoxValue(context.groupGC.font.fontFamily));
+        context.setGroupAttrs(group.get(), ELEMENTTYPE_TEXT);
+        const AllocationCounter counter;
+        context.setGroupAttrs(group.get(), ELEMENTTYPE_TEXT);
+        EXPECT_EQ(0U, counter.getCount());
+        EXPECT_FALSE(group->hasAttribute(SVGName(SVGName::font_family)));
+    }
 }
 
 INSTANTIATE_TEST_SUITE_P(Allocation, Comparison,

@@ -140,6 +140,15 @@ TEST(GraphicContext, AssigningTellsTextsOfOneLengthApart) {
     EXPECT_TRUE(record.strokeColor.isBogus());
 }
 
+TEST(GraphicContext, AssigningTellsPatternsOfOneLengthApart) {
+    GraphicContext record;
+    GraphicContext other;
+    record.dashArray = {MoxLength::fromRaw(3.0F), MoxLength::fromRaw(2.0F)};
+    other.dashArray = {MoxLength::fromRaw(3.0F), MoxLength::fromRaw(1.0F)};
+    record = other;
+    EXPECT_EQ(record.dashArray, other.dashArray);
+}
+
 TEST(GraphicContext, AssigningARecordToItselfChangesNothing) {
     GraphicContext record = makeOddRecord();
     const GraphicContext& same = record;

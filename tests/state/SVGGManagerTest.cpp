@@ -103,6 +103,17 @@ TEST(SVGGManager, EachTextInARealFontStartsItsOwnGroup) {
     EXPECT_EQ(groupsOfTexts(SVGFont(), SVGFont()), 2U);
 }
 
+TEST(SVGGManager, ATextBehindATextHasAGroupOfTextsToo) {
+    StatePage page;
+    SVGFont font = sharingFont();
+    font.fontSize = pt(12);
+    page.state().setFont(font);
+    page.drawText();
+    page.drawText();
+    EXPECT_EQ(page.manager.elementMode, ELEMENTTYPE_TEXT);
+    EXPECT_EQ(attributesOf(page.close()), "font-size=12 font-weight=400");
+}
+
 TEST(SVGGManager, TextsWithoutASizeShareAGroup) {
     EXPECT_EQ(groupsOfTexts(sharingFont(), sharingFont()), 1U);
 }
@@ -215,6 +226,22 @@ TEST(SVGGManager, PopBringsEverythingBack) {
         EXPECT_EQ(state.tinyFillColors[u"g1"], u"#abc");
         EXPECT_EQ(state.rootMatrix.a, 2);
     }
+}
+
+TEST(SVGGManager, APushBehindAPopSavesAllOfTheStateItFinds) {
+    StatePage page;
+    page.manager.push(ELEMENT_TYPE_PLAIN);
+    page.state().setFillColorName(u"red");
+    page.manager.pop(ELEMENT_TYPE_PLAIN);
+    page.state().setFillColorName(u"blue");
+    page.state().setClipPathID(u"c1");
+    page.manager.push(ELEMENT_TYPE_MASK);
+    EXPECT_EQ(page.manager.contextStack.back()->getType(), ELEMENT_TYPE_MASK);
+    EXPECT_EQ(popError(page.manager, ELEMENT_TYPE_PLAIN), otherType);
+    page.state().setClipPathID(u"c2");
+    EXPECT_EQ(popError(page.manager, ELEMENT_TYPE_MASK), "");
+    EXPECT_EQ(page.state().currentGC.fillColor, u"blue");
+    EXPECT_EQ(page.state().clipPathId, u"url(#c1)");
 }
 
 TEST(SVGGManager, NothingIsBeingDefinedAfterAnyPop) {

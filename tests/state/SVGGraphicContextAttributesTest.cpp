@@ -76,6 +76,8 @@ TEST(SVGGraphicContextAttributes, StrokeWidthIsAbsentWithoutAStroke) {
     writing.state().setStrokeColorName(u"none");
     writing.state().setStrokeWidth(pt(3));
     EXPECT_EQ(writing.stroke(ATTRIBUTEFLAG_STROKEWIDTH), "");
+    writing.state().setStrokeColorName(u"nonesuch"); // the whole text counts
+    EXPECT_EQ(writing.stroke(ATTRIBUTEFLAG_STROKEWIDTH), "stroke-width=3");
 }
 
 TEST(SVGGraphicContextAttributes, AZeroWidthIsAHairline) {

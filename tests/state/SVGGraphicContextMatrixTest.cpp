@@ -58,6 +58,13 @@ TEST(SVGGraphicContextMatrix, AMatrixIsWrittenByItsKind) {
     }
 }
 
+TEST(SVGGraphicContextMatrix, AnglesAreDoublesThatAreRoundedOnce) {
+    // A shorter pi, or an arc in single precision, would change the last digit of each.
+    EXPECT_EQ(textOf({1, 0, 4, 1, 0, 0}), "skewX(75.96375)");
+    EXPECT_EQ(textOf({1, 9.44F, 0, 1, 0, 0}), "skewY(83.95308)");
+    EXPECT_EQ(textOf({0.465F, 0.88531065F, -0.88531065F, 0.465F, 0, 0}), "rotate(62.289776)");
+}
+
 TEST(SVGGraphicContextMatrix, AMatrixNearARotationIsWrittenAsOne) {
     EXPECT_EQ(textOf({0.98F, 0.1F, -0.1F, 0.5F, 0, 0}).substr(0, 7), "rotate(");
 }
@@ -115,6 +122,22 @@ TEST(SVGGraphicContextMatrix, SettingMatricesAccumulates) {
 
 TEST(SVGGraphicContextMatrix, AScalingByNothingIsIgnored) {
     EXPECT_EQ(afterSetting({0, 0, 0, 0, 0, 0}), "translate(1,2)");
+}
+
+TEST(SVGGraphicContextMatrix, AScalingByNothingIsIgnoredByItsNumbersNotItsKind) {
+    SVGMatrix product = SVGMatrix().scale(0);
+    ASSERT_EQ(product.type, MATRIXTYPE_ROTATE);
+    EXPECT_EQ(afterSetting(product), "translate(1,2)");
+}
+
+TEST(SVGGraphicContextMatrix, WhatAccumulatesIsNotClassified) {
+    SVGGraphicContext state(nullptr);
+    state.setTransMatrix(twice);
+    EXPECT_EQ(state.currentGC.transMatrix.a, 2);
+    EXPECT_EQ(state.currentGC.transMatrix.type, MATRIXTYPE_ROTATE); // as a product comes
+    state.groupGC.transMatrix = state.currentGC.transMatrix;
+    state.copyCur2Group(/*multiply=*/false);
+    EXPECT_EQ(state.groupGC.transMatrix.type, MATRIXTYPE_ROTATE);
 }
 
 TEST(SVGGraphicContextMatrix, OtherMatricesWithZerosAreNotIgnored) {
@@ -233,6 +256,70 @@ TEST(SVGGraphicContextMatrix, AMatrixThatSaysNothingWritesNothing) {
     page.state().currentGC.transMatrix = SVGMatrix(0, 0, 0, 0, 0, 0);
     page.state().setTransformAttr(element.get(), TRANSFORMMODE_CURRENT);
     EXPECT_EQ(attributesOf(element.get()), "");
+}
+
+TEST(SVGGraphicContextMatrix, AGroupUnderTheRootTakesTheRootMatrix) {
+    StatePage page;
+    page.state().rootMatrix = SVGMatrix(1, 0, 0, 1, 7, 8);
+    page.state().groupGC.transMatrix = SVGMatrix(2, 0, 0, 2, 0, 0);
+    page.drawRect();
+    EXPECT_EQ(attributesOf(page.close()), "transform=translate(7,8)");
+}
+
+TEST(SVGGraphicContextMatrix, AGroupElsewhereTakesItsOwnMatrix) {
+    StatePage page;
+    page.enterContainer();
+    page.state().rootMatrix = SVGMatrix(1, 0, 0, 1, 7, 8);
+    page.state().groupGC.transMatrix = SVGMatrix(2, 0, 0, 2, 0, 0);
+    page.drawRect();
+    EXPECT_EQ(attributesOf(page.close()), "transform=scale(2,2)");
+}
+
+TEST(SVGGraphicContextMatrix, AnElementInAGroupTakesTheCurrentMatrix) {
+    StatePage page;
+    page.state().rootMatrix = SVGMatrix(1, 0, 0, 1, 7, 8);
+    page.state().setTransMatrix(SVGMatrix(1, 0, 0, 1, 5, 6));
+    EXPECT_EQ(attributesOf(page.drawRect()), "transform=translate(5,6)");
+}
+
+TEST(SVGGraphicContextMatrix, ATextTakesTheCurrentMatrixThoughItHasAChild) {
+    StatePage page;
+    page.state().setTransMatrix(SVGMatrix(1, 0, 0, 1, 5, 6));
+    const MoxPtr<SVGElement> text = page.make(SVGName::text);
+    page.manager.addElement(text.get());
+    EXPECT_EQ(attributesOf(text.get()), "transform=translate(5,6)");
+}
+
+TEST(SVGGraphicContextMatrix, AnElementTakesTheMatrixOfThePlaceWhereItStands) {
+    const struct {
+        SVGName::Number name;
+        bool underRoot;
+        bool hasChild;
+        const char* text;
+    } rows[] = {
+        {SVGName::rect, true, false, "transform=translate(10,20)"},
+        {SVGName::text, true, true, "transform=translate(10,20)"},
+        {SVGName::g, true, true, "transform=translate(10,20)"},
+        {SVGName::g, false, true, "transform=scale(2,2)"},
+        {SVGName::a, false, true, "transform=scale(2,2)"},
+        {SVGName::rect, false, true, "transform=scale(2,2)"},
+        {SVGName::g, false, false, "transform=rotate(90)"},
+        {SVGName::text, false, true, "transform=rotate(90)"},
+        {SVGName::rect, false, false, "transform=rotate(90)"},
+    };
+
+    for (const auto& row : rows) {
+        for (const bool isGroup : {false, true}) { // the matrix doesn't depend on it
+            Levels levels(row.underRoot);
+            const MoxPtr<SVGElement> element = levels.tree.document->createSVGElement(row.name);
+            levels.element->getParentNode()->appendChild(element.get());
+            if (row.hasChild) {
+                element->appendChild(levels.make(SVGName::desc).get());
+            }
+            levels.state().AttrValueCompare(element.get(), isGroup, ELEMENTTYPE_IMAGE);
+            EXPECT_EQ(attributesOf(element.get()), row.text) << row.name;
+        }
+    }
 }
 
 } // namespace

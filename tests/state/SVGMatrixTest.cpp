@@ -64,6 +64,7 @@ const KindRow kindRows[] = {
     {"d beyond its range", {0.98F, 0.1F, -0.1F, 1.5F, 0, 0}, 0},
     {"d is NaN", {0.98F, 0.1F, -0.1F, nan, 0, 0}, 0},
     {"b and c not opposite", {0.98F, 0.1F, -0.11F, 0.98F, 0, 0}, 0},
+    {"b and c opposite but for the last bit", {0.98F, 0.1F, -0.10000001F, 0.98F, 0, 0}, 0},
     {"b beyond its range", {0, 1.5F, -1.5F, 0, 0, 0}, 0},
     {"a is 1 and b is tiny", {1, 1e-5F, -1e-5F, 1, 0, 0}, 5},
     {"skew along x", {1, 0, 1, 1, 0, 0}, 7},
@@ -91,6 +92,13 @@ TEST(SVGMatrix, MultiplyPutsThisOnTheLeft) {
 
 TEST(SVGMatrix, MatrixIsTheProductWithItsArguments) {
     EXPECT_EQ(numbersOf(general().matrix(1, 2, 3, 4, 5, 6)), (Six{12, 17, 26, 37, 51, 70}));
+}
+
+TEST(SVGMatrix, ProductsAreRoundedAtEachStep) {
+    SVGMatrix m(19, 7.6F, 14.4F, 13.6F, 2.8F, 15.8F);
+    // Sums in double precision would give 454.48001 and 358.38 for the first and the fifth.
+    EXPECT_EQ(numbersOf(m.matrix(19.6F, 5.7F, 7.2F, 11.2F, 12.5F, 8.2F)),
+              (Six{454.47998F, 226.48001F, 298.08002F, 207.04001F, 358.37997F, 222.32001F}));
 }
 
 TEST(SVGMatrix, MultiplyByItselfSquares) {
@@ -124,6 +132,22 @@ TEST(SVGMatrix, RotateRoundsItsDoublesOnce) {
 TEST(SVGMatrix, RotateKnowsNineDigitsOfPi) {
     // The exact pi would give about 1e-16.
     EXPECT_NEAR(SVGMatrix().rotate(180).b, 3.58979e-9F, 1e-13F);
+}
+
+TEST(SVGMatrix, AnglesAreNotRoundedBeforeTheSums) {
+    // At these angles each number changes when sine, cosine or slope is rounded to a float first.
+    const double t = 3.14159265 * static_cast<double>(5.8F) / 180.0;
+    const SVGMatrix turned = general().rotate(5.8F);
+    EXPECT_EQ(turned.a, static_cast<float>(2 * std::cos(t) + 5 * std::sin(t)));
+    EXPECT_EQ(turned.b, static_cast<float>(3 * std::cos(t) + 7 * std::sin(t)));
+    EXPECT_EQ(turned.c, static_cast<float>(2 * -std::sin(t) + 5 * std::cos(t)));
+    EXPECT_EQ(turned.d, static_cast<float>(3 * -std::sin(t) + 7 * std::cos(t)));
+    const double alongX = std::tan(3.14159265 * static_cast<double>(47.8F) / 180.0);
+    EXPECT_EQ(general().skewX(47.8F).c, static_cast<float>(2 * alongX + 5));
+    EXPECT_EQ(general().skewX(47.8F).d, static_cast<float>(3 * alongX + 7));
+    const double alongY = std::tan(3.14159265 * static_cast<double>(14.3F) / 180.0);
+    EXPECT_EQ(general().skewY(14.3F).a, static_cast<float>(2 + 5 * alongY));
+    EXPECT_EQ(general().skewY(14.3F).b, static_cast<float>(3 + 7 * alongY));
 }
 
 TEST(SVGMatrix, SkewXChangesTheSecondColumn) {
@@ -193,6 +217,15 @@ TEST(SVGMatrix, RotateFromVectorRotatesByTheAngleOfTheVector) {
     EXPECT_EQ(numbersOf(m), numbersOf(SVGMatrix().rotate(degrees)));
 }
 
+TEST(SVGMatrix, RotateFromVectorRoundsTheQuotientAndTheDegrees) {
+    // The quotient, the arc or the degrees of one radian in another precision each turn by
+    // 39.610687.
+    EXPECT_EQ(numbersOf(SVGMatrix().rotateFromVector(29, 24)),
+              numbersOf(SVGMatrix().rotate(39.610691F)));
+    EXPECT_NE(numbersOf(SVGMatrix().rotateFromVector(29, 24)),
+              numbersOf(SVGMatrix().rotate(39.610687F)));
+}
+
 TEST(SVGMatrix, RotateFromVectorTakesAVectorAndItsOppositeForTheSame) {
     EXPECT_EQ(numbersOf(general().rotateFromVector(-1, -1)),
               numbersOf(general().rotateFromVector(1, 1)));
@@ -211,6 +244,18 @@ TEST(SVGMatrix, InverseUndoesTheMatrix) {
     EXPECT_EQ(numbersOf(m.inverse()), (Six{0.5F, 0, 0, 0.25F, -3, -2}));
     SVGMatrix turned(1, 2, 3, 4, 5, 6);
     EXPECT_EQ(numbersOf(turned.inverse()), (Six{-2, 1, 1.5F, -0.5F, 1, -2}));
+}
+
+TEST(SVGMatrix, InverseIsRoundedAtEachStep) {
+    SVGMatrix m(5.5F, 17.4F, 18, 11.2F, 15.8F, 3.5F);
+    EXPECT_EQ(numbersOf(m.inverse()), (Six{-0.0445151068F, 0.0691573992F, 0.0715421364F,
+                                           -0.0218600966F, 0.452941239F, -1.01617646F}));
+}
+
+TEST(SVGMatrix, AMatrixIsSingularWhenItsRoundedProductsAgree) {
+    EXPECT_EQ(numbersOf(SVGMatrix(4, 8.8F, 5, 11, 1, 2).inverse()), (Six{1, 0, 0, 1, 0, 0}));
+    const float huge = std::numeric_limits<float>::max();
+    EXPECT_EQ(numbersOf(SVGMatrix(huge, huge, 2, 2, 1, 2).inverse()), (Six{1, 0, 0, 1, 0, 0}));
 }
 
 TEST(SVGMatrix, InverseOfASingularMatrixIsTheIdentity) {

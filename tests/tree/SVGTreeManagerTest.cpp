@@ -474,6 +474,18 @@ TEST_F(SVGTreeManagerTest, NullArgumentsAreIgnored) {
     EXPECT_TRUE(tree.fontStack.empty());
 }
 
+TEST_F(SVGTreeManagerTest, ASavedCursorOutlivesItsPlaceInTheTree) {
+    SVGFont font;
+    add(SVGName::g, true);
+    tree.push(ELEMENT_TYPE_LINK, &state);
+    root->removeChild(root->getFirstChild());
+    tree.pop(ELEMENT_TYPE_LINK, &font);
+    EXPECT_EQ(nameOf(tree.getCurrentNode()), "g");
+    EXPECT_EQ(tree.getCurrentNode()->getParentNode(), nullptr);
+    EXPECT_NE(add(SVGName::rect, false), nullptr);
+    EXPECT_EQ(childrenOf(root), "");
+}
+
 TEST_F(SVGTreeManagerTest, DefinitionsNestAndComeBackOutWhereDrawingWas) {
     SVGFont font;
     SVGElement* g = add(SVGName::g, true);

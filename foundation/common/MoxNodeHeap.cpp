@@ -1,0 +1,234 @@
+#include "foundation/common/MoxNodeHeap.h"
+
+#include "foundation/common/MoxMutex.h"
+
+#include <cstdint>
+#include <cstdlib>
+#include <new>
+#include <sys/mman.h>
+
+#if defined(__has_feature)
+#if __has_feature(address_sanitizer) || __has_feature(thread_sanitizer)
+#define MOX_SANITIZED 1
+#endif
+#endif
+#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
+#define MOX_SANITIZED 1
+#endif
+
+namespace MoxCommonNS {
+namespace {
+
+#ifdef MOX_SANITIZED
+constexpr std::size_t largestBlock = 0;
+#else
+constexpr std::size_t largestBlock = 2048;
+#endif
+
+/// Chunks stand at multiples of this, so that a block finds its own.
+constexpr std::size_t chunkAlignment = 32768;
+/// A little less, which leaves the general allocator its header and lets it pack chunks.
+constexpr std::size_t chunkSize = chunkAlignment - 16;
+constexpr std::size_t blockAlignment = 16;
+
+/// Large documents take their chunks from slabs, which the system can back with one huge page each.
+constexpr std::size_t slabSize = std::size_t{1} << 21;
+constexpr std::size_t chunksOfSlab = slabSize / chunkAlignment;
+/// So many chunks in a row make a document large.
+constexpr int chunksBeforeSlabs = 16;
+
+struct Slab;
+
+/// The head of a chunk; its blocks follow.
+struct alignas(blockAlignment) Chunk {
+    int users;  // its blocks, and the thread that cuts from it
+    Slab* slab; // borrowed; null for a chunk that stands alone
+};
+
+/// The head of a slab's first chunk.
+struct alignas(blockAlignment) Slab {
+    Chunk firstChunk;
+    int users; // its chunks, and the thread that cuts from it
+
+    char* chunkAt(std::size_t index) {
+        return reinterpret_cast<char*>(this) + index * chunkAlignment;
+    }
+};
+
+constexpr std::size_t roundUp(std::size_t size) {
+    return (size + blockAlignment - 1) & ~(blockAlignment - 1);
+}
+
+void drop(Slab* slab) {
+    if (MoxMutex::interlockedDecrement(slab->users) == 0) {
+        std::free(slab);
+    }
+}
+
+/// Returns: whether the chunk went with its last user.
+bool drop(Chunk* chunk) {
+    if (MoxMutex::interlockedDecrement(chunk->users) != 0) {
+        return false;
+    }
+    if (chunk->slab) {
+        drop(chunk->slab);
+    } else {
+        std::free(chunk);
+    }
+    return true;
+}
+
+void* allocateAligned(std::size_t alignment, std::size_t size) {
+    void* memory = nullptr;
+    if (posix_memalign(&memory, alignment, size) != 0) {
+        throw std::bad_alloc();
+    }
+    return memory;
+}
+
+Chunk* findChunk(void* block) {
+    const auto address = reinterpret_cast<std::uintptr_t>(block);
+    return reinterpret_cast<Chunk*>(address & ~(std::uintptr_t{chunkAlignment} - 1));
+}
+
+/// Where a thread cuts its next block.
+struct Cutter {
+    char* cursor = nullptr;
+    char* end = nullptr;
+    Chunk* chunk = nullptr; // owned, as one of its users
+    Slab* slab = nullptr;   // owned, as one of its users
+    std::size_t nextOfSlab = 0;
+    int chunksInRow = 0;
+
+    std::size_t room() const { return static_cast<std::size_t>(end - cursor); }
+
+    bool isNewest(void* block, std::size_t size) const {
+        return static_cast<char*>(block) + size == cursor;
+    }
+
+    void close() {
+        closeChunk();
+        closeSlab();
+        chunksInRow = 0;
+    }
+
+    void renew();
+
+private:
+    void closeChunk();
+    void closeSlab();
+    void openChunk(char* memory, std::size_t headSize, Slab* owner);
+    void openChunkOfSlab();
+};
+
+constinit thread_local Cutter cutter;
+
+/// Gives the thread's chunk back when the thread ends.
+struct ThreadEnd {
+    bool isArmed = false;
+
+    ~ThreadEnd() { cutter.close(); }
+};
+
+thread_local ThreadEnd threadEnd;
+
+void Cutter::closeChunk() {
+    if (chunk && drop(chunk)) {
+        chunksInRow = 0; // what it was cut for is gone
+    }
+    chunk = nullptr;
+    cursor = nullptr;
+    end = nullptr;
+}
+
+void Cutter::closeSlab() {
+    if (slab) {
+        drop(slab);
+    }
+    slab = nullptr;
+}
+
+void Cutter::openChunk(char* memory, std::size_t headSize, Slab* owner) {
+    chunk = new (memory) Chunk{1, owner};
+    cursor = memory + headSize;
+    end = memory + chunkSize;
+}
+
+void Cutter::openChunkOfSlab() {
+    if (slab && nextOfSlab == chunksOfSlab) {
+        closeSlab();
+    }
+    if (!slab) {
+        void* memory = allocateAligned(slabSize, slabSize);
+        // A wish: without it the slab is made of small pages.
+        static_cast<void>(madvise(memory, slabSize, MADV_HUGEPAGE));
+        slab = static_cast<Slab*>(memory);
+        slab->users = 1;
+        nextOfSlab = 0;
+    }
+    const std::size_t headSize = nextOfSlab == 0 ? sizeof(Slab) : sizeof(Chunk);
+    MoxMutex::interlockedIncrement(slab->users);
+    openChunk(slab->chunkAt(nextOfSlab), headSize, slab);
+    ++nextOfSlab;
+}
+
+void Cutter::renew() {
+    closeChunk();
+    threadEnd.isArmed = true; // the first use makes it, and so its end will come
+    if (++chunksInRow > chunksBeforeSlabs) {
+        openChunkOfSlab();
+        return;
+    }
+    closeSlab();
+    openChunk(static_cast<char*>(allocateAligned(chunkAlignment, chunkSize)), sizeof(Chunk),
+              nullptr);
+}
+
+void* allocateLarge(std::size_t size) {
+    void* block = std::malloc(size);
+    if (!block) {
+        throw std::bad_alloc();
+    }
+    return block;
+}
+
+} // namespace
+
+void* MoxNodeHeap::allocate(std::size_t size) {
+    const std::size_t rounded = roundUp(size);
+    if (rounded > largestBlock) {
+        return allocateLarge(size);
+    }
+    if (rounded > cutter.room()) {
+        cutter.renew();
+    }
+    char* block = cutter.cursor;
+    cutter.cursor += rounded;
+    MoxMutex::interlockedIncrement(cutter.chunk->users);
+    return block;
+}
+
+void MoxNodeHeap::release(void* block, std::size_t size) {
+    const std::size_t rounded = roundUp(size);
+    if (!block || rounded > largestBlock) {
+        std::free(block);
+        return;
+    }
+    if (cutter.isNewest(block, rounded)) {
+        cutter.cursor -= rounded;
+    }
+    drop(findChunk(block));
+}
+
+bool MoxNodeHeap::growInPlace(void* block, std::size_t size, std::size_t newSize) {
+    const std::size_t rounded = roundUp(size);
+    const std::size_t newRounded = roundUp(newSize);
+    if (!block || newRounded > largestBlock || !cutter.isNewest(block, rounded) ||
+        newRounded - rounded > cutter.room()) {
+        return false;
+    }
+    cutter.cursor += newRounded - rounded;
+    return true;
+}
+
+} // namespace MoxCommonNS

@@ -1,0 +1,28 @@
+/// The memory of trees: blocks that are cut one behind the other and given back together.
+#pragma once
+
+#include "DrawmereExport.h"
+
+#include <cstddef>
+
+namespace MoxCommonNS {
+
+/// Cuts blocks from chunks and gives a chunk back when its last block is gone. A block is not used
+/// again by itself, except the newest: that suits documents, which grow at their end and go as a
+/// whole, and it spares each node the book-keeping of the general allocator.
+/// Threads: each cuts from a chunk of its own, and any may release any block. A build with a
+/// sanitizer takes every block from the general allocator, so that the sanitizer sees it.
+class DRAWMERE_API MoxNodeHeap {
+public:
+    /// Returns: a block of `size` bytes, aligned to 16. Throws: std::bad_alloc.
+    static void* allocate(std::size_t size);
+
+    /// Gives a block back. `size`: as allocated or grown to. Ignores: a null.
+    static void release(void* block, std::size_t size);
+
+    /// Makes a block of `size` bytes larger where it stands, which the newest block of the thread
+    /// can be while its chunk has room. Returns: whether it has `newSize` bytes now.
+    static bool growInPlace(void* block, std::size_t size, std::size_t newSize);
+};
+
+} // namespace MoxCommonNS
