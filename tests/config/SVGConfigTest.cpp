@@ -320,6 +320,14 @@ TEST(SVGConfig, AdjustedLengthKeepsLargeValuesOnlyInTheFullProfile) {
     EXPECT_EQ(adjustedLength(SVGConfig::SVGTYPE_FULL, 0.5F), 0.5F);
 }
 
+TEST(SVGConfig, OnlyTheFullProfileIsWithoutALimit) {
+    for (const auto type : {SVGConfig::SVGTYPE_BASIC, SVGConfig::SVGTYPE_TINY,
+                            SVGConfig::SVGTYPE_WISP, SVGConfig::SVGTYPE_PLAZMIC}) {
+        EXPECT_EQ(adjustedLength(type, 40000.0F), 32768.0F) << type;
+    }
+    EXPECT_EQ(adjustedLength(SVGConfig::SVGTYPE_FULL, 40000.0F), 40000.0F);
+}
+
 TEST(SVGConfig, LengthThatIsNotPositiveBecomesTheLimit) {
     for (const auto type : {SVGConfig::SVGTYPE_FULL, SVGConfig::SVGTYPE_TINY}) {
         EXPECT_EQ(adjustedLength(type, 0.0F), 32768.0F);

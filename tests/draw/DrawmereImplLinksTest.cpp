@@ -3,6 +3,7 @@
 #include "tests/draw/DrawnTree.h"
 
 #include <gtest/gtest.h>
+#include <limits>
 
 namespace DrawmereTest {
 namespace {
@@ -78,6 +79,16 @@ TEST(DrawmereImplLinks, DestinationsArePageContent) {
                                           "<g transform=\"translate(0)\">\n<text id=\"a\"/>\n</g>\n"
                                           "<view viewBox=\"1 2 3 4\" id=\"v\"/>\n") +
                                   dot + "\n</g>\n</a>\n");
+}
+
+TEST(DrawmereImplLinks, DestinationsOfNoFiniteNumbersAreWrittenWithZeros) {
+    constexpr float infinite = std::numeric_limits<float>::infinity();
+    DrawnTree tree;
+    tree.impl.setInternalView(u"v", std::numeric_limits<float>::quiet_NaN(), infinite, 1, 2);
+    tree.impl.setInternalLinkAnchor(u"a", 1, -infinite);
+    tree.impl.finishRootSvg();
+    EXPECT_NE(tree.content().find("viewBox=\"0 0 1 2\""), std::string::npos);
+    EXPECT_NE(tree.content().find("transform=\"translate(0)\""), std::string::npos);
 }
 
 } // namespace

@@ -9,6 +9,7 @@
 #include "tree/SVGTreeManager.h"
 
 #include <gtest/gtest.h>
+#include <limits>
 
 namespace DrawmereTest {
 namespace {
@@ -112,6 +113,17 @@ TEST(DrawmereImplCanvas, IsWrittenInTheUnitAskedForAndTheViewBoxInPoints) {
     }
 }
 
+TEST(DrawmereImplCanvas, OfNoFiniteSizeIsWrittenAsZero) {
+    constexpr float infinite = std::numeric_limits<float>::infinity();
+    DrawnTree tree;
+    tree.impl.setCanvasSize(pt(std::numeric_limits<float>::quiet_NaN()), pt(infinite));
+    EXPECT_EQ(tree.rootAttribute(SVGName::width), "0pt");
+    EXPECT_EQ(tree.rootAttribute(SVGName::viewBox), "0 0 0 0");
+    tree.impl.setCanvasSize(pt(-infinite), pt(2), MOXUNIT_CM);
+    EXPECT_EQ(tree.rootAttribute(SVGName::width), "0cm");
+    EXPECT_EQ(tree.rootAttribute(SVGName::viewBox), "0 0 0 2");
+}
+
 TEST(DrawmereImplCanvas, CanBeSetAgain) {
     DrawnTree tree;
     tree.impl.setCanvasSize(pt(72), pt(144), MOXUNIT_INCH);
@@ -131,6 +143,16 @@ TEST(DrawmereImplCanvas, IsIgnoredBeforeThereIsARoot) {
 }
 
 // States.
+
+TEST(DrawmereImplStates, AnEndOfALinkWithNothingSavedSetsTheDefaultFont) {
+    DrawnTree tree;
+    SVGFont font;
+    font.setFontAttribute(u"Serif", pt(12), 700, FSTYLE_NORMAL, u"", false);
+    tree.impl.getGContext()->setFont(font);
+    tree.impl.endLink();
+    EXPECT_EQ(utf8(tree.impl.getGContext()->getFont()->fontName), "");
+    EXPECT_EQ(tree.impl.getGContext()->getFont()->fontWeight, 400);
+}
 
 TEST(DrawmereImplStates, AreSavedWithTheFontAndTakenBackWithIt) {
     DrawnTree tree;

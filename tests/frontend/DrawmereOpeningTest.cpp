@@ -31,6 +31,11 @@ TEST_F(DrawmerePaths, AMissingDirectoryIs16410) {
     EXPECT_EQ(run.drawmere.impl, nullptr);
 }
 
+TEST_F(DrawmerePaths, AUriThatNamesNoFileHasNoDirectoryThatExists) {
+    run.uri.setText(u"http://example.com/pages/out.svg");
+    EXPECT_EQ(open(), "16410 The svg output path (http://example.com/pages/) doesn't exist.");
+}
+
 TEST_F(DrawmerePaths, AMissingDirectoryIsNotAskedForWithoutTheCheckOrForAStream) {
     run.uri.setText(run.directory.uri("missing/out.svg"));
     run.config.imageCopyUri = run.directory.uri("missing too");
