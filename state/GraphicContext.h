@@ -1,6 +1,7 @@
 /// One full set of the attributes that callers set.
 #pragma once
 
+#include "DrawmereExport.h"
 #include "DrawmereTypes.h"
 #include "SVGFont.h"
 #include "SVGMatrix.h"
@@ -16,14 +17,14 @@ using MoxCommonNS::MoxLength;
 using MoxCommonNS::MoxName;
 
 /// Makes `to` the font `from`, where they differ.
-void assignFont(SVGFont& to, const SVGFont& from);
+DRAWMERE_API void assignFont(SVGFont& to, const SVGFont& from);
 
 /// A plain record, copied member by member; texts are ready to be written as they stand. The order
 /// of the members is interface.
 ///
 /// On purpose: its defaults are not those of SVG 1.1. The fill rule is "evenodd" and both paints
 /// are "none"; taking SVG's would change what every comparison finds worth writing.
-struct GraphicContext {
+struct DRAWMERE_API GraphicContext {
     GraphicContext() = default;
     GraphicContext(const GraphicContext&) = default;
     ~GraphicContext() = default;
@@ -56,7 +57,7 @@ struct GraphicContext {
 
 /// Returns: the record of the defaults that everything is compared with; it lives until the process
 /// ends.
-const GraphicContext& getDefaultGC();
+DRAWMERE_API const GraphicContext& getDefaultGC();
 
 /// The same record by its name.
 /// It may be used before main: the reference is inline, so each source that includes this header

@@ -42,7 +42,7 @@ enum TRANSFORMMODE : std::int32_t {
 /// Two full sets of attributes, the current one that setters change and that of the open group, and
 /// the matrix that stands at root level. Setters only store; nothing touches the tree before one of
 /// the writing operations is asked to.
-class SVGGraphicContext {
+class DRAWMERE_API SVGGraphicContext {
 public:
     /// Borrows: `svgConfig`, which says how colours are written; by name where that is shorter when
     /// it is null.

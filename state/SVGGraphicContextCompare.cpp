@@ -1,4 +1,5 @@
 // The part of the graphic state that decides which attributes an element needs.
+#include "fonts/FontValues.h"
 #include "foundation/common/MoxDocument.h"
 #include "foundation/common/MoxNameTable.h"
 #include "state/SVGGraphicContext.h"
@@ -6,6 +7,7 @@
 
 #include <algorithm>
 #include <string_view>
+#include <utility>
 
 namespace DrawmereNS {
 namespace {
@@ -73,9 +75,9 @@ bool rootTakesFamily(MoxElement* root, const UnicodeString& family) {
     return saysFamily(root->getAttribute(SVGName(SVGName::font_family)), family);
 }
 
-void writeUnlessNormal(SVGElement* element, SVGName name, const UnicodeString& text) {
-    if (text != u"normal") {
-        element->setSVGAttribute(name, MoxValue(text));
+void writeUnlessNormal(SVGElement* element, SVGName name, MoxValue&& value) {
+    if (value.getAsciiText() != "normal") {
+        element->setSVGAttribute(name, std::move(value));
     }
 }
 
@@ -156,17 +158,15 @@ void SVGGraphicContext::writeTextDifferences(SVGElement* element, bool isGroup) 
 }
 
 void SVGGraphicContext::writeFont(SVGElement* group, const SVGFont& font) const {
-    SVGFontAttr2String::FONTATTRSTRING texts;
-    SVGFontAttr2String::getFontAttrStr(font, texts);
     // On purpose: the first text group gives its family to the root and carries none itself.
     if (!rootTakesFamily(findRoot(*group), font.fontFamily)) {
         group->setSVGAttribute(SVGName::font_family, MoxValue(font.fontFamily));
     }
-    group->setSVGAttribute(SVGName::font_size, MoxValue(texts.fontSize));
-    writeUnlessNormal(group, SVGName::font_style, texts.fontStyle);
-    writeUnlessNormal(group, SVGName::font_weight, texts.fontWeight);
+    group->setSVGAttribute(SVGName::font_size, makeFontSizeValue(font.fontSize));
+    writeUnlessNormal(group, SVGName::font_style, getFontStyleWord(font.fontStyle));
+    writeUnlessNormal(group, SVGName::font_weight, makeFontWeightValue(font.fontWeight));
     if (!isTiny()) {
-        writeUnlessNormal(group, SVGName::font_stretch, texts.fontStretch);
+        writeUnlessNormal(group, SVGName::font_stretch, getFontStretchWord(font.fontStretch));
     }
 }
 

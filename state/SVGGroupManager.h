@@ -28,7 +28,7 @@ class SVGTreeManager;
 /// carry what differs from the group. A group is closed while `groupElement` is null.
 /// The virtual operations are for the managers of pages and of paths; here they do nothing. Their
 /// order is interface.
-class SVGGroupManager {
+class DRAWMERE_API SVGGroupManager {
 public:
     /// Makes a graphic state of its own. Borrows: `svgConfig`, for as long as this lives.
     explicit SVGGroupManager(SVGConfig* svgConfig);

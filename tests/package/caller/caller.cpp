@@ -1,11 +1,17 @@
 #include "Drawmere.h"
 #include "SVGConfig.h"
 #include "SVGPageUri.h"
+#include "config/SVGZip.h"
+#include "draw/SVGTinyImpl.h"
+#include "frontend/DrawmereError.h"
+#include "state/SVGGraphicContext.h"
+#include "tree/SVGUtil.h"
 
 #include <cstdio>
 #include <fstream>
 #include <iostream>
 #include <iterator>
+#include <sstream>
 #include <string>
 
 using namespace DrawmereNS;
@@ -27,6 +33,25 @@ static void drawPage(const UnicodeString& path) {
     drawmere.finish();
 }
 
+/// Draws on what stands behind the public class, which callers may derive from.
+static std::string drawDirectly() {
+    SVGConfig config;
+    SVGTinyImpl impl(&config);
+    impl.initRootSvg();
+    impl.getGContext()->setStrokeColor(MoxColor(0, 0, 255));
+    impl.drawLine(pt(0), pt(0), pt(10), pt(10), PAINTMODE_STROKE);
+    impl.finishRootSvg();
+    std::ostringstream compressed;
+    {
+        SVGZipStream stream(compressed);
+        impl.outputStream(impl.getDocument(), UnicodeString(), &stream, UnicodeString());
+    }
+    const UnicodeString name = SVGUtil::getColorString(MoxColor(255, 0, 0), true);
+    const UnicodeString text = DrawmereError::getErrorMessage(16406, UnicodeString());
+    std::string result;
+    return compressed.str().empty() || name != u"red" ? result : text.toUTF8String(result);
+}
+
 static std::string readFile(const std::string& path) {
     std::ifstream file(path, std::ios::binary);
     return {std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>()};
@@ -38,5 +63,6 @@ int main(int argc, char** argv) {
     drawPage(UnicodeString::fromUTF8(path));
     const std::string written = readFile(path);
     std::cout << written;
-    return written.find("<rect") == std::string::npos ? 1 : 0;
+    const bool drawsDirectly = drawDirectly() == "Pop a empty stack.";
+    return drawsDirectly && written.find("<rect") != std::string::npos ? 0 : 1;
 }
