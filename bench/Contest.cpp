@@ -83,6 +83,9 @@ void printContest(const Contest& contest) {
         std::printf("  goal for %s: at most %.1fx\n", contest.contenders[1].name.c_str(),
                     contest.goal);
     }
+    if (contest.bytesGoal > 0.0) {
+        std::printf("  goal for its bytes: at most %.2fx\n", contest.bytesGoal);
+    }
 }
 
 void measure(benchmark::State& state, const Contender& contender) {

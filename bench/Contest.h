@@ -43,7 +43,8 @@ struct Contender {
 struct Contest {
     std::string title;
     std::vector<Contender> contenders;
-    double goal = 0.0; ///< the ratio that the second contender may have, 0 for none
+    double goal = 0.0;      ///< the ratio that the second contender may have, 0 for none
+    double bytesGoal = 0.0; ///< the same for the bytes it writes
 };
 
 /// Runs the contenders of each contest in turn, round after round, and prints a table: the medians

@@ -89,6 +89,53 @@ void PlainWriter::drawLine(float x1, float y1, float x2, float y2) {
     endEmptyElement();
 }
 
+void PlainWriter::startPath() {
+    startElement("path");
+    startAttribute("d");
+}
+
+void PlainWriter::moveTo(float x, float y) {
+    append("M");
+    appendPoint(x, y);
+}
+
+void PlainWriter::lineTo(float x, float y) {
+    append("L");
+    appendPoint(x, y);
+}
+
+void PlainWriter::curveTo(float x1, float y1, float x2, float y2, float x3, float y3) {
+    append("C");
+    appendPoint(x1, y1);
+    append(" ");
+    appendPoint(x2, y2);
+    append(" ");
+    appendPoint(x3, y3);
+}
+
+void PlainWriter::endPath() {
+    append("\"");
+    addPaint({.fill = false, .stroke = true});
+    endEmptyElement();
+}
+
+void PlainWriter::drawText(std::string_view text, std::span<const float> x, float y) {
+    startElement("text");
+    startAttribute("x");
+    for (const float& number : x) {
+        append(&number == x.data() ? "" : " ");
+        appendNumber(number + state.shiftX);
+    }
+    append("\"");
+    addNumber("y", y + state.shiftY);
+    addText("font-family", fontFamily);
+    addNumber("font-size", fontSize);
+    addPaint({.fill = true, .stroke = false});
+    append(">");
+    append(text);
+    append("</text>");
+}
+
 void PlainWriter::startElement(std::string_view name) {
     append("<");
     append(name);
@@ -156,6 +203,12 @@ void PlainWriter::appendNumber(float value) {
     const auto end =
         std::to_chars(begin, begin + maxNumber, value, std::chars_format::fixed, decimals).ptr;
     cursor = dropTrailingZeros(end);
+}
+
+void PlainWriter::appendPoint(float x, float y) {
+    appendNumber(x + state.shiftX);
+    append(",");
+    appendNumber(y + state.shiftY);
 }
 
 char* PlainWriter::room(std::size_t count) {

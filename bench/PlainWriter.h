@@ -3,6 +3,7 @@
 
 #include <cstdint>
 #include <memory>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -59,6 +60,21 @@ public:
     void drawCircle(float cx, float cy, float r, Paint paint);
     void drawLine(float x1, float y1, float x2, float y2);
 
+    // A path: started, given its segments, and ended; it has no fill.
+    void startPath();
+    void moveTo(float x, float y);
+    void lineTo(float x, float y);
+    void curveTo(float x1, float y1, float x2, float y2, float x3, float y3);
+    void endPath();
+
+    void setFont(std::string_view family, float size) {
+        fontFamily = family;
+        fontSize = size;
+    }
+
+    /// Writes a run of text at one x or one for each character. `text` needs no escapes.
+    void drawText(std::string_view text, std::span<const float> x, float y);
+
     // Markup as it stands: an element is started, gets its attributes, and is ended.
     void startElement(std::string_view name);
     void addNumber(std::string_view name, float value);
@@ -82,6 +98,7 @@ private:
 
     void append(std::string_view bytes);
     void appendNumber(float value);
+    void appendPoint(float x, float y);
     void startAttribute(std::string_view name);
     void addPaint(Paint paint);
     char* room(std::size_t count);
@@ -92,6 +109,8 @@ private:
     std::size_t flushed = 0;
     State state;
     std::vector<State> saved;
+    std::string fontFamily;
+    float fontSize = 0.0F;
     std::unique_ptr<char[]> buffer;
     char* cursor;
 };

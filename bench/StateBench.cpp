@@ -1,10 +1,6 @@
 // The public class at work, from the first call to the saved file.
-#include "Drawmere.h"
-#include "bench/BenchFile.h"
 #include "bench/BenchShapes.h"
-#include "bench/Contest.h"
-#include "bench/PlainWriter.h"
-#include "bench/peers/CairoPeer.h"
+#include "bench/DrawContest.h"
 
 #include <benchmark/benchmark.h>
 
@@ -16,8 +12,6 @@ constexpr std::size_t rectCount = 200'000;
 constexpr std::size_t rectsOfOneColor = 10;
 
 using Rects = std::vector<BenchRect>;
-
-MoxLength pt(float number) { return MoxLength::fromRaw(number); }
 
 // Each round moves the origin to the corner of its rectangle.
 
@@ -93,67 +87,15 @@ void drawRects(CairoPeer& cairo, const Rects& rects) {
 constexpr auto states = [](auto& target, const Rects& rects) { drawStates(target, rects); };
 constexpr auto rectangles = [](auto& target, const Rects& rects) { drawRects(target, rects); };
 
-template <typename Draw> ContestResult runPlain(Draw draw, const Rects& rects, const BenchFile& f) {
-    const Stopwatch watch;
-    PlainWriter writer(f.getPath());
-    writer.startPage(benchPageWidth, benchPageHeight);
-    draw(writer, rects);
-    const std::size_t bytes = writer.finish();
-    return {watch.getTime(), bytes};
-}
-
-template <typename Draw> void makeFile(Draw draw, const Rects& rects, const UnicodeString& path) {
-    SVGConfig config;
-    config.streamOutput = false;
-    config.singleFile = true;
-    config.saveOption = u"decimals=3";
-    SVGPageUri uri(path);
-    Drawmere drawmere(&config, &uri);
-    drawmere.initRootSvg(path);
-    drawmere.startPage(1,
-                       MoxRectT<MoxLength>(pt(0), pt(0), pt(benchPageWidth), pt(benchPageHeight)));
-    drawmere.setCanvasSize(pt(benchPageWidth), pt(benchPageHeight));
-    draw(drawmere, rects);
-    drawmere.endPage();
-    drawmere.finishRootSvg();
-    drawmere.finish();
-}
-
-template <typename Draw>
-ContestResult runDrawmere(Draw draw, const Rects& rects, const BenchFile& f) {
-    const Stopwatch watch;
-    makeFile(draw, rects, UnicodeString::fromUTF8(f.getPath()));
-    return {watch.getTime(), f.getSize()};
-}
-
-template <typename Draw> ContestResult runCairo(Draw draw, const Rects& rects, const BenchFile& f) {
-    const Stopwatch watch;
-    CairoPeer cairo(f.getPath(), benchPageWidth, benchPageHeight);
-    draw(cairo, rects);
-    cairo.finish();
-    return {watch.getTime(), f.getSize()};
-}
-
-template <typename Draw>
-Contest makeContest(const char* title, Draw draw, const Rects& rects, const BenchFile& file,
-                    double goal) {
-    return {title,
-            {
-                {"plain", [&, draw] { return runPlain(draw, rects, file); }},
-                {"drawmere", [&, draw] { return runDrawmere(draw, rects, file); }},
-                {"cairo", [&, draw] { return runCairo(draw, rects, file); }, /*isSlow=*/true},
-            },
-            goal};
-}
-
 void run(int argc, char** argv) {
     benchmark::Initialize(&argc, argv);
     const BenchFile file;
     const Rects manyStates = makeBenchRects(scaleCount(stateCount));
     const Rects manyRects = makeBenchRects(scaleCount(rectCount));
-    runContests({makeContest("state changes: push, transform, width, rectangle, pop", states,
-                             manyStates, file, 2.2),
-                 makeContest("rectangles, filled and stroked", rectangles, manyRects, file, 2.0)});
+    runContests({makeDrawContest("state changes: push, transform, width, rectangle, pop", states,
+                                 manyStates, file, {.wall = 2.2}),
+                 makeDrawContest("rectangles, filled and stroked", rectangles, manyRects, file,
+                                 {.wall = 2.0})});
 }
 
 } // namespace

@@ -3,13 +3,13 @@
 #include "bench/BenchShapes.h"
 #include "bench/Contest.h"
 #include "bench/PlainWriter.h"
+#include "bench/ResidentMemory.h"
 #include "foundation/common/MoxColor.h"
 #include "tree/SVGDocument.h"
 
 #include <benchmark/benchmark.h>
 #include <cstdio>
 #include <fstream>
-#include <malloc.h>
 #include <utility>
 
 namespace DrawmereNS {
@@ -103,15 +103,10 @@ Contest makeTreeContest(const Rects& rects, const DocumentPtr& built, const Benc
             2.0};
 }
 
-std::size_t countHeapBytes() {
-    const auto info = mallinfo2();
-    return info.uordblks + info.hblkhd;
-}
-
 void printMemory(const Rects& rects) {
-    const std::size_t before = countHeapBytes();
+    const std::size_t before = countResidentBytes();
     const DocumentPtr document = buildTree(rects);
-    const std::size_t used = countHeapBytes() - before;
+    const std::size_t used = countResidentBytes() - before;
     std::printf("\nmemory\n  %.1f bytes for an element with six attributes; goal: at most 250\n",
                 static_cast<double>(used) / static_cast<double>(rects.size()));
 }

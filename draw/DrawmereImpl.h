@@ -221,8 +221,6 @@ protected:
 private:
     void finishShape(SVGElement* element, PAINTMODE mode);
     void closePathManager();
-    void setPosition(SVGElement& element, SVGName name,
-                     const std::vector<MoxLength>& positions) const;
     void handOverFont();
     void registerText(const UnicodeString& text, TLStringWithGlyphInfo* glyphs, bool wholeRun);
     void setViewBox(SVGElement* root, MoxLength width, MoxLength height) const;

@@ -71,10 +71,9 @@ void DrawmereImpl::endPathData(PAINTMODE mode) {
     if (!savedGroupManager) {
         return;
     }
-    const bool isEmpty = groupManager->getPathSeg().isEmpty();
-    MoxValue data(groupManager->getPathSeg());
+    MoxValue data = groupManager->takePathData();
     closePathManager();
-    if (isEmpty) {
+    if (data.getType() == MoxCommonNS::MOXVALUE_NULL) {
         return;
     }
     const MoxPtr<SVGElement> path = createElement(SVGName::path);

@@ -7,6 +7,9 @@
 #include "state/SVGGroupManager.h"
 
 #include <algorithm>
+#include <memory>
+#include <span>
+#include <string_view>
 
 namespace DrawmereNS {
 namespace {
@@ -14,35 +17,63 @@ namespace {
 using MoxCommonNS::MOXUNIT_POINT;
 
 /// One position serves all characters. A NaN equals nothing, itself included.
-bool isUniform(const std::vector<MoxLength>& positions) {
+bool isUniform(std::span<const MoxLength> positions) {
     return positions.size() < 2 ||
            std::all_of(positions.begin(), positions.end(), [&positions](MoxLength position) {
                return position.getRawValue() == positions.front().getRawValue();
            });
 }
 
+/// The bytes of a list of positions. Usual lists fit into the object.
+class PositionText {
+public:
+    explicit PositionText(std::span<const MoxLength> positions) {
+        if (positions.empty()) {
+            return;
+        }
+        const bool uniform = isUniform(positions);
+        if (!uniform || positions.front().getRealValue(MOXUNIT_POINT) != 0.0F) {
+            write(uniform ? positions.first(1) : positions);
+        }
+    }
+
+    std::string_view get() const { return text; }
+
+private:
+    static constexpr std::size_t nearCount = 16;
+    /// A number and the blank in front of it.
+    static constexpr std::size_t maxEntry = maxRuleText + 1;
+
+    void write(std::span<const MoxLength> positions) {
+        if (positions.size() > nearCount) {
+            far = std::make_unique_for_overwrite<char[]>(positions.size() * maxEntry);
+        }
+        char* const begin = far ? far.get() : near;
+        char* end = begin;
+        for (const MoxLength& position : positions) {
+            *end = ' ';
+            end = writeRuleNumber(position, end + 1);
+        }
+        text = {begin + 1, static_cast<std::size_t>(end - begin) - 1};
+    }
+
+    char near[nearCount * maxEntry];
+    std::unique_ptr<char[]> far; // for long lists
+    std::string_view text;
+};
+
+void setPositions(SVGElement& element, SVGName name, std::span<const MoxLength> positions) {
+    const PositionText text(positions);
+    if (!text.get().empty()) {
+        element.setSVGAttribute(name, MoxValue::fromAscii(text.get()));
+    }
+}
+
 } // namespace
 
 UnicodeString
 DrawmereImpl::makePositionAttributeString(const std::vector<MoxLength>& positions) const {
-    char16_t digits[maxRuleText];
-    UnicodeString text;
-    if (positions.empty()) {
-        return text;
-    }
-    const bool uniform = isUniform(positions);
-    if (uniform && positions.front().getRealValue(MOXUNIT_POINT) == 0.0F) {
-        return text;
-    }
-    const std::size_t count = uniform ? 1 : positions.size();
-    for (std::size_t i = 0; i < count; ++i) {
-        if (i > 0) {
-            text.append(u' ');
-        }
-        const char16_t* end = writeRuleNumber(positions[i], digits);
-        text.append(digits, static_cast<std::int32_t>(end - digits));
-    }
-    return text;
+    return UnicodeString::fromUTF8(PositionText(positions).get());
 }
 
 void DrawmereImpl::drawText(const UnicodeString& text, const MoxLength& x, const MoxLength& y,
@@ -60,8 +91,8 @@ void DrawmereImpl::drawText(const UnicodeString& text, const std::vector<MoxLeng
         return;
     }
     const MoxPtr<SVGElement> element = createElement(SVGName::text);
-    setPosition(*element, SVGName::x, x);
-    setPosition(*element, SVGName::y, y);
+    setPositions(*element, SVGName::x, x);
+    setPositions(*element, SVGName::y, y);
     if (!leftToRight) {
         element->setSVGAttribute(SVGName::direction, u"rtl");
     }
@@ -73,14 +104,6 @@ void DrawmereImpl::drawText(const UnicodeString& text, const std::vector<MoxLeng
     setPaintAttr(element.get(), mode);
     handOverFont();
     registerText(text, glyphs, wholeRun);
-}
-
-void DrawmereImpl::setPosition(SVGElement& element, SVGName name,
-                               const std::vector<MoxLength>& positions) const {
-    const UnicodeString text = makePositionAttributeString(positions);
-    if (!text.isEmpty()) {
-        element.setSVGAttribute(name, text);
-    }
 }
 
 void DrawmereImpl::handOverFont() {

@@ -57,21 +57,17 @@ void SVGDrawElement::makeRelative(const MoxPointT<MoxLength>& /*origin*/) {}
 
 const char* SVGDrawElement::toString() { return nullptr; }
 
-char16_t* SVGDrawElement::writeText(char16_t* out) const { return out; }
+char* SVGDrawElement::writeText(char* out) const { return out; }
 
 bool SVGDrawElement::isAbsolute() const {
     return drawName >= DRAWELEMENT_MOVE && drawName <= DRAWELEMENT_QUADRATIC && drawName % 2 == 1;
 }
 
 const char* SVGDrawElement::makeText() {
-    char16_t wide[maxText];
-    const char16_t* end = writeText(wide);
     if (!text) {
         text = std::make_unique<char[]>(maxText + 1);
     }
-    char* target = std::transform(static_cast<const char16_t*>(wide), end, text.get(),
-                                  [](char16_t c) { return static_cast<char>(c); });
-    *target = '\0';
+    *writeText(text.get()) = '\0';
     return text.get();
 }
 
@@ -116,8 +112,8 @@ void SVGDrawElementClose::makeRelative(const MoxPointT<MoxLength>& /*origin*/) {
 
 const char* SVGDrawElementClose::toString() { return makeText(); }
 
-char16_t* SVGDrawElementClose::writeText(char16_t* out) const {
-    *out = static_cast<unsigned char>(letter);
+char* SVGDrawElementClose::writeText(char* out) const {
+    *out = letter;
     return out + 1;
 }
 
@@ -152,8 +148,8 @@ void SVGDrawElementMoveTo::makeRelative(const MoxPointT<MoxLength>& origin) {
 
 const char* SVGDrawElementMoveTo::toString() { return makeText(); }
 
-char16_t* SVGDrawElementMoveTo::writeText(char16_t* out) const {
-    *out = static_cast<unsigned char>(letter);
+char* SVGDrawElementMoveTo::writeText(char* out) const {
+    *out = letter;
     return writeRulePoint(point, out + 1);
 }
 
@@ -176,20 +172,20 @@ void SVGDrawElementLineTo::makeRelative(const MoxPointT<MoxLength>& origin) {
 
 const char* SVGDrawElementLineTo::toString() { return makeText(); }
 
-char16_t* SVGDrawElementLineTo::writeText(char16_t* out) const {
+char* SVGDrawElementLineTo::writeText(char* out) const {
     if (drawName == DRAWELEMENT_LINE) {
-        *out = u'L';
+        *out = 'L';
         return writeRulePoint(point, out + 1);
     }
     if (isRuleZero(point.x)) {
-        *out = u'v';
+        *out = 'v';
         return writeRuleNumber(point.y, out + 1);
     }
     if (isRuleZero(point.y)) {
-        *out = u'h';
+        *out = 'h';
         return writeRuleNumber(point.x, out + 1);
     }
-    *out = u'l';
+    *out = 'l';
     return writeRulePoint(point, out + 1);
 }
 
@@ -232,12 +228,12 @@ void SVGDrawElementCubicBezierCurveTo::makeRelative(const MoxPointT<MoxLength>& 
 
 const char* SVGDrawElementCubicBezierCurveTo::toString() { return makeText(); }
 
-char16_t* SVGDrawElementCubicBezierCurveTo::writeText(char16_t* out) const {
-    *out = static_cast<unsigned char>(letter);
+char* SVGDrawElementCubicBezierCurveTo::writeText(char* out) const {
+    *out = letter;
     out = writeRulePoint(point1, out + 1);
-    *out = u' ';
+    *out = ' ';
     out = writeRulePoint(point2, out + 1);
-    *out = u' ';
+    *out = ' ';
     return writeRulePoint(point, out + 1);
 }
 
@@ -269,10 +265,10 @@ void SVGDrawElementQuadraticBezierCurveTo::makeRelative(const MoxPointT<MoxLengt
 
 const char* SVGDrawElementQuadraticBezierCurveTo::toString() { return makeText(); }
 
-char16_t* SVGDrawElementQuadraticBezierCurveTo::writeText(char16_t* out) const {
-    *out = static_cast<unsigned char>(letter);
+char* SVGDrawElementQuadraticBezierCurveTo::writeText(char* out) const {
+    *out = letter;
     out = writeRulePoint(point1, out + 1);
-    *out = u' ';
+    *out = ' ';
     return writeRulePoint(point2, out + 1);
 }
 

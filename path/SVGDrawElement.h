@@ -5,6 +5,7 @@
 #include "foundation/common/MoxPointT.h"
 #include "foundation/common/MoxRCObject.h"
 #include "foundation/common/MoxString.h"
+#include "path/SVGSegmentHeap.h"
 
 #include <memory>
 
@@ -39,6 +40,12 @@ public:
     /// Room that the text of any segment fits into: a letter, six numbers and what parts them.
     static constexpr std::size_t maxText = 272;
 
+    static void* operator new(std::size_t size) { return SVGSegmentHeap::allocate(size); }
+
+    static void operator delete(void* segment, std::size_t size) {
+        SVGSegmentHeap::release(segment, size);
+    }
+
     ~SVGDrawElement() override;
     std::uint32_t getTypeID() const override;
     bool isA(std::uint32_t id) const override;
@@ -62,7 +69,7 @@ public:
 
     /// Writes the text without a terminator; nothing for a class that stands for no command.
     /// Shape: `out` has room for `maxText` characters. Returns: the end of the text.
-    virtual char16_t* writeText(char16_t* out) const;
+    virtual char* writeText(char* out) const;
 
     void setDrawType(DrawmereDrawElementEnum type) { drawType = type; }
 
@@ -86,7 +93,7 @@ public:
 protected:
     explicit SVGDrawElement(char commandLetter) : letter(commandLetter) {}
 
-    /// The text of `writeText` as bytes, kept until the next call.
+    /// The text of `writeText` with a terminator, kept until the next call.
     const char* makeText();
 
     char letter;
@@ -106,7 +113,7 @@ public:
     const char* getTypeName() const override;
     void makeRelative(const MoxPointT<MoxLength>& origin) override;
     const char* toString() override;
-    char16_t* writeText(char16_t* out) const override;
+    char* writeText(char* out) const override;
 };
 
 /// A segment with one point.
@@ -138,7 +145,7 @@ public:
     const char* getTypeName() const override;
     void makeRelative(const MoxPointT<MoxLength>& origin) override;
     const char* toString() override;
-    char16_t* writeText(char16_t* out) const override;
+    char* writeText(char* out) const override;
 };
 
 /// A line. A relative one that is horizontal or vertical takes the shorter command.
@@ -152,7 +159,7 @@ public:
     const char* getTypeName() const override;
     void makeRelative(const MoxPointT<MoxLength>& origin) override;
     const char* toString() override;
-    char16_t* writeText(char16_t* out) const override;
+    char* writeText(char* out) const override;
 };
 
 /// A curve with two control points and a target.
@@ -174,7 +181,7 @@ public:
     MoxPointT<MoxLength> getPoint2() const override;
     void makeRelative(const MoxPointT<MoxLength>& origin) override;
     const char* toString() override;
-    char16_t* writeText(char16_t* out) const override;
+    char* writeText(char* out) const override;
 
     MoxPointT<MoxLength> point1;
     MoxPointT<MoxLength> point2;
@@ -198,7 +205,7 @@ public:
     /// Leaves `drawName` alone, so `isAbsolute` stays true.
     void makeRelative(const MoxPointT<MoxLength>& origin) override;
     const char* toString() override;
-    char16_t* writeText(char16_t* out) const override;
+    char* writeText(char* out) const override;
 
     MoxPointT<MoxLength> point1;
     MoxPointT<MoxLength> point2;

@@ -1,62 +1,101 @@
 #include "path/SVGPathManager.h"
 
 #include <algorithm>
+#include <cstdlib>
+#include <cstring>
 #include <new>
+#include <string_view>
+#include <utility>
 
 namespace DrawmereNS {
 namespace {
 
-/// Long paths grow into this without reallocation.
-constexpr std::int32_t initialCapacity = 32000;
-/// As far as one string goes; a few characters less than it can count.
-constexpr std::int32_t largestCapacity = INT32_MAX - 64;
 /// What the manager of a path answers as its type.
 constexpr int pathManagerType = 4;
 
-/// Path data in the making, written straight into the string's own buffer.
+/// Room for the segments of a usual path.
+constexpr std::size_t usualSegments = 64;
+
+/// As far as one string can count.
+constexpr std::size_t largestText = INT32_MAX;
+
+using Segments = std::vector<MoxPtr<SVGDrawElement>>;
+
+/// Follows a path and makes its segments relative, in their order.
+class RelativePen {
+public:
+    explicit RelativePen(const SVGDrawElement& move)
+        : subpathStart(move.getPoint()), current(subpathStart) {}
+
+    void step(SVGDrawElement& segment) {
+        if (!segment.isAbsolute()) {
+            return;
+        }
+        // Read before the segment is made relative, which overwrites its points.
+        MoxPointT<MoxLength> target = segment.getPoint();
+        if (segment.drawName == DRAWELEMENT_MOVE) {
+            subpathStart = target;
+        } else if (segment.drawName == DRAWELEMENT_CLOSE) {
+            target = subpathStart;
+        }
+        segment.makeRelative(current);
+        current = target;
+    }
+
+private:
+    MoxPointT<MoxLength> subpathStart;
+    MoxPointT<MoxLength> current;
+};
+
+} // namespace
+
+/// Path data in the making. Usual paths fit into the object; a longer text moves to the heap, where
+/// it grows without being copied as far as the system can do that.
 class PathText {
 public:
-    explicit PathText(UnicodeString& target) : text(target) { open(initialCapacity); }
+    PathText() = default;
+    PathText(const PathText&) = delete;
+    PathText& operator=(const PathText&) = delete;
+
+    ~PathText() { std::free(heap); }
 
     void append(const SVGDrawElement& segment) {
-        if (end - cursor < static_cast<std::ptrdiff_t>(SVGDrawElement::maxText)) {
+        if (static_cast<std::size_t>(end - cursor) < SVGDrawElement::maxText) {
             grow();
         }
         cursor = segment.writeText(cursor);
     }
 
-    void close() { text.releaseBuffer(static_cast<std::int32_t>(cursor - begin)); }
+    std::string_view get() const { return {begin, static_cast<std::size_t>(cursor - begin)}; }
 
 private:
-    void open(std::int32_t capacity) {
-        const std::int32_t length = text.length();
-        begin = text.getBuffer(capacity);
-        if (!begin) {
-            throw std::bad_alloc();
-        }
-        cursor = begin + length;
-        end = begin + text.getCapacity();
-    }
-
     void grow() {
-        const std::int64_t wanted = 2 * static_cast<std::int64_t>(end - begin);
-        close();
-        if (end - begin >= largestCapacity) {
+        const auto length = static_cast<std::size_t>(cursor - begin);
+        const auto oldCapacity = static_cast<std::size_t>(end - begin);
+        const std::size_t capacity = std::min(2 * oldCapacity, largestText);
+        void* memory = capacity > oldCapacity ? std::realloc(heap, capacity) : nullptr;
+        if (!memory) {
             throw std::bad_alloc();
         }
-        open(static_cast<std::int32_t>(std::min<std::int64_t>(wanted, largestCapacity)));
+        if (!heap) {
+            std::memcpy(memory, begin, length);
+        }
+        heap = static_cast<char*>(memory);
+        begin = heap;
+        cursor = begin + length;
+        end = begin + capacity;
     }
 
-    UnicodeString& text;
-    char16_t* begin = nullptr;
-    char16_t* cursor = nullptr;
-    char16_t* end = nullptr;
+    char near[16384];
+    char* heap = nullptr; // owned
+    char* begin = near;
+    char* cursor = near;
+    char* end = near + sizeof(near);
 };
 
-} // namespace
-
-SVGPathManager::SVGPathManager(SVGConfig* svgConfig)
-    : SVGGroupManager(svgConfig), pathData(initialCapacity, 0, 0) {}
+SVGPathManager::SVGPathManager(SVGConfig* svgConfig) : SVGGroupManager(svgConfig) {
+    segments.reserve(usualSegments);
+}
 
 SVGPathManager::~SVGPathManager() = default;
 
@@ -73,20 +112,41 @@ void SVGPathManager::addPathSeg(const UnicodeString& text, bool /*absolute*/) {
 }
 
 const UnicodeString& SVGPathManager::getPathSeg() {
-    if (segments.empty()) {
-        return pathData;
+    if (!segments.empty()) {
+        PathText text;
+        writeSegments(text);
+        // On purpose: raw text goes when there are segments. Keeping it would put arcs, which are
+        // raw text, in front of the moves and lines they were drawn between.
+        pathData = UnicodeString::fromUTF8(text.get());
     }
-    makePathDataRealtive();
-    // On purpose: raw text goes when there are segments. Keeping it would put arcs, which are raw
-    // text, in front of the moves and lines they were drawn between.
-    pathData.remove();
-    PathText data(pathData);
-    for (const MoxPtr<SVGDrawElement>& segment : segments) {
-        data.append(*segment);
-    }
-    data.close();
-    segments.clear();
     return pathData;
+}
+
+MoxValue SVGPathManager::takePathData() {
+    PathText text;
+    if (!segments.empty()) {
+        writeSegments(text);
+        pathData.remove();
+    }
+    const UnicodeString raw = std::exchange(pathData, {});
+    if (!raw.isEmpty()) {
+        return raw;
+    }
+    return text.get().empty() ? MoxValue() : MoxValue::fromAscii(text.get());
+}
+
+void SVGPathManager::writeSegments(PathText& text) {
+    // Taken out first: if memory runs short, the path is lost and not half relative.
+    Segments taken = std::exchange(segments, {});
+    const bool isRelative = taken.front()->drawName == DRAWELEMENT_MOVE;
+    RelativePen pen(*taken.front());
+    text.append(*taken.front());
+    for (std::size_t i = 1; i < taken.size(); ++i) {
+        if (isRelative) {
+            pen.step(*taken[i]);
+        }
+        text.append(*taken[i]);
+    }
 }
 
 void SVGPathManager::deletePathSeg() {
@@ -108,22 +168,9 @@ void SVGPathManager::makePathDataRealtive() {
     if (segments.empty() || segments.front()->drawName != DRAWELEMENT_MOVE) {
         return;
     }
-    MoxPointT<MoxLength> subpathStart = segments.front()->getPoint();
-    MoxPointT<MoxLength> current = subpathStart;
+    RelativePen pen(*segments.front());
     for (std::size_t i = 1; i < segments.size(); ++i) {
-        SVGDrawElement& segment = *segments[i];
-        if (!segment.isAbsolute()) {
-            continue;
-        }
-        // Read before the segment is made relative, which overwrites its points.
-        MoxPointT<MoxLength> target = segment.getPoint();
-        if (segment.drawName == DRAWELEMENT_MOVE) {
-            subpathStart = target;
-        } else if (segment.drawName == DRAWELEMENT_CLOSE) {
-            target = subpathStart;
-        }
-        segment.makeRelative(current);
-        current = target;
+        pen.step(*segments[i]);
     }
 }
 

@@ -8,6 +8,8 @@
 
 namespace DrawmereNS {
 
+class PathText;
+
 /// Stands in the place of the page's group manager while a path is open. What it collects becomes
 /// the path data: the first command absolute, all others relative. Its graphic state is its own and
 /// goes with it.
@@ -29,6 +31,8 @@ public:
     const UnicodeString& getPathSeg() override;
     void deletePathSeg() override;
 
+    MoxValue takePathData() override;
+
     /// With `lock` keeps elements out; without it turns the lock over, whichever way it is.
     void addPathLock(bool lock) override;
     void setElemMode(PAINTMODE mode, ELEMENTTYPE kind) override;
@@ -38,6 +42,10 @@ public:
 
     UnicodeString pathData;
     std::vector<MoxPtr<SVGDrawElement>> segments;
+
+private:
+    /// Makes the segments relative and writes them behind each other, then lets go of them.
+    void writeSegments(PathText& text);
 };
 
 } // namespace DrawmereNS

@@ -1,7 +1,7 @@
 // The part of the graphic state that decides which attributes an element needs.
-#include "fonts/FontValues.h"
 #include "foundation/common/MoxDocument.h"
 #include "foundation/common/MoxNameTable.h"
+#include "state/FontValues.h"
 #include "state/SVGGraphicContext.h"
 #include "tree/SVGUtil.h"
 

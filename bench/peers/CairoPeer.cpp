@@ -18,6 +18,7 @@ CairoPeer::CairoPeer(const std::string& path, float width, float height)
       context(cairo_create(surface)) {}
 
 CairoPeer::~CairoPeer() {
+    cairo_glyph_free(glyphs);
     cairo_destroy(context);
     cairo_surface_destroy(surface);
 }
@@ -38,6 +39,40 @@ void CairoPeer::fillAndStrokeRect(float x, float y, float width, float height) {
     cairo_fill_preserve(context);
     setSource(strokeColor);
     cairo_stroke(context);
+}
+
+void CairoPeer::moveTo(float x, float y) { cairo_move_to(context, wide(x), wide(y)); }
+
+void CairoPeer::lineTo(float x, float y) { cairo_line_to(context, wide(x), wide(y)); }
+
+void CairoPeer::curveTo(float x1, float y1, float x2, float y2, float x3, float y3) {
+    cairo_curve_to(context, wide(x1), wide(y1), wide(x2), wide(y2), wide(x3), wide(y3));
+}
+
+void CairoPeer::strokePath() {
+    setSource(strokeColor);
+    cairo_stroke(context);
+}
+
+void CairoPeer::setFont(const char* family, float size) {
+    cairo_select_font_face(context, family, CAIRO_FONT_SLANT_NORMAL, CAIRO_FONT_WEIGHT_NORMAL);
+    cairo_set_font_size(context, wide(size));
+}
+
+void CairoPeer::drawText(const char* text, float x, float y) {
+    setSource(fillColor);
+    cairo_move_to(context, wide(x), wide(y));
+    cairo_show_text(context, text);
+}
+
+void CairoPeer::drawText(const char* text, const float* x, float y) {
+    setSource(fillColor);
+    cairo_scaled_font_text_to_glyphs(cairo_get_scaled_font(context), 0.0, wide(y), text, -1,
+                                     &glyphs, &glyphCount, nullptr, nullptr, nullptr);
+    for (int i = 0; i < glyphCount; ++i) {
+        glyphs[i].x = wide(x[i]);
+    }
+    cairo_show_glyphs(context, glyphs, glyphCount);
 }
 
 bool CairoPeer::finish() {

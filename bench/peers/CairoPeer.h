@@ -32,6 +32,21 @@ public:
     void strokeRect(float x, float y, float width, float height);
     void fillAndStrokeRect(float x, float y, float width, float height);
 
+    // A path: started with a move and stroked.
+    void moveTo(float x, float y);
+    void lineTo(float x, float y);
+    void curveTo(float x1, float y1, float x2, float y2, float x3, float y3);
+    void strokePath();
+
+    /// Takes a face by cairo's own short way.
+    void setFont(const char* family, float size);
+
+    /// Draws `text`, without a kerning of its own.
+    void drawText(const char* text, float x, float y);
+
+    /// Draws `text` with one x for each glyph. Shape: `x` has as many numbers as `text` glyphs.
+    void drawText(const char* text, const float* x, float y);
+
     /// Ends the document. Returns: whether all went well.
     bool finish();
 
@@ -39,8 +54,10 @@ private:
     void setSource(std::uint32_t rgb);
     void addRect(float x, float y, float width, float height);
 
-    cairo_surface_t* surface; // owned
-    cairo_t* context;         // owned
+    cairo_surface_t* surface;        // owned
+    cairo_t* context;                // owned
+    cairo_glyph_t* glyphs = nullptr; // owned
+    int glyphCount = 0;
     std::uint32_t fillColor = 0;
     std::uint32_t strokeColor = 0;
 };

@@ -185,9 +185,9 @@ TEST(SVGDrawElementClasses, BecomesRelativeAsItsClassDoes) {
 TEST(SVGDrawElementClasses, TheTextIsWrittenInPlaceAsToStringGivesIt) {
     for (const ClassRow& row : classRows) {
         const MoxPtr<SVGDrawElement> segment(row.make());
-        char16_t wide[SVGDrawElement::maxText];
-        const char16_t* end = segment->writeText(wide);
-        const std::string written(static_cast<const char16_t*>(wide), end);
+        char text[SVGDrawElement::maxText];
+        const char* end = segment->writeText(text);
+        const std::string written(static_cast<const char*>(text), end);
         EXPECT_EQ(written, segment->toString() ? segment->toString() : "") << row.name;
     }
 }

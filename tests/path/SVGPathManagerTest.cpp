@@ -174,6 +174,44 @@ TEST(SVGPathManager, ASecondCallGivesTheSameText) {
     EXPECT_TRUE(path.manager.pathLock);
 }
 
+TEST(SVGPathManager, TheTakenDataIsTheSameTextAndIsGoneThen) {
+    Path path;
+    path.move(10, 20).line(15, 23).quadratic(at(20, 20), at(30, 10)).close();
+    const MoxValue taken = path.manager.takePathData();
+    EXPECT_EQ(taken.getAsciiText(), "M10,20l5,3q5,-3 15,-13z");
+    EXPECT_TRUE(path.manager.segments.empty());
+    EXPECT_EQ(path.data(), "");
+}
+
+TEST(SVGPathManager, TakenWithoutSegmentsRawTextIsTheDataAndNothingIsNull) {
+    Path path;
+    EXPECT_EQ(path.manager.takePathData().getType(), MoxCommonNS::MOXVALUE_NULL);
+    path.manager.addPathSeg(u"z \u00e4", false);
+    EXPECT_EQ(utf8(path.manager.takePathData().toString()), "z \xC3\xA4");
+    EXPECT_EQ(path.manager.takePathData().getType(), MoxCommonNS::MOXVALUE_NULL);
+}
+
+TEST(SVGPathManager, SegmentsWithoutTextMakeNoData) {
+    struct Silent : SVGDrawElement {
+        Silent() : SVGDrawElement('X') {}
+    };
+
+    Path path;
+    path.add(MoxPtr<SVGDrawElement>(new Silent));
+    EXPECT_EQ(path.manager.takePathData().getType(), MoxCommonNS::MOXVALUE_NULL);
+}
+
+TEST(SVGPathManager, APathLongerThanTheFirstRoomIsWhole) {
+    Path path;
+    std::string expected = "M0,0";
+    path.move(0, 0);
+    for (int i = 1; i <= 20'000; ++i) {
+        path.line(static_cast<float>(i % 2), static_cast<float>(i));
+        expected += i % 2 == 1 ? "l1,1" : "l-1,1";
+    }
+    EXPECT_EQ(path.manager.takePathData().getAsciiText(), expected);
+}
+
 TEST(SVGPathManager, RawTextAloneIsTheDataUnchanged) {
     Path path;
     path.manager.addPathSeg(u"A1 2 0 0 1 5 6", true);

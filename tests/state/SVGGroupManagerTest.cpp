@@ -52,6 +52,7 @@ TEST(SVGGroupManager, ItsVirtualOperationsDoNothing) {
     manager.setScale(3);
     EXPECT_EQ(manager.getType(), 0);
     EXPECT_TRUE(manager.getPathSeg().isEmpty());
+    EXPECT_EQ(manager.takePathData().getType(), MoxCommonNS::MOXVALUE_NULL);
     EXPECT_FALSE(manager.pathLock);
     EXPECT_EQ(manager.elementMode, ELEMENTTYPE_SHAPE);
     EXPECT_EQ(manager.paintMode, 0);
