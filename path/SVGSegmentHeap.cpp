@@ -42,8 +42,8 @@ struct alignas(16) Chunk {
     char* end() { return reinterpret_cast<char*>(this) + chunkSize; }
 
     static Chunk* of(void* block) {
-        const auto address = reinterpret_cast<std::uintptr_t>(block);
-        return reinterpret_cast<Chunk*>(address & ~(std::uintptr_t{chunkSize} - 1));
+        const std::size_t offset = reinterpret_cast<std::uintptr_t>(block) % chunkSize;
+        return reinterpret_cast<Chunk*>(static_cast<char*>(block) - offset);
     }
 };
 

@@ -87,8 +87,8 @@ void* allocateAligned(std::size_t alignment, std::size_t size) {
 }
 
 Chunk* findChunk(void* block) {
-    const auto address = reinterpret_cast<std::uintptr_t>(block);
-    return reinterpret_cast<Chunk*>(address & ~(std::uintptr_t{chunkAlignment} - 1));
+    const std::size_t offset = reinterpret_cast<std::uintptr_t>(block) % chunkAlignment;
+    return reinterpret_cast<Chunk*>(static_cast<char*>(block) - offset);
 }
 
 /// Where a thread cuts its next block.
