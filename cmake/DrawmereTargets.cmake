@@ -34,12 +34,21 @@ endif()
 # What the library stands on.
 add_library(drawmere_depends INTERFACE)
 target_link_libraries(drawmere_depends INTERFACE
+    GIF::GIF
     ICU::i18n
     ICU::uc
+    JPEG::JPEG
+    PNG::PNG
+    PkgConfig::FONTCONFIG
+    PkgConfig::FREETYPE
+    PkgConfig::HARFBUZZ
     PkgConfig::URIPARSER
+    PkgConfig::WEBP
+    TIFF::TIFF
     Threads::Threads
     ZLIB::ZLIB
 )
+target_include_directories(drawmere_depends SYSTEM INTERFACE ${STB_INCLUDE_DIR})
 
 add_library(mox OBJECT)
 add_library(drawmere_objects OBJECT)
