@@ -199,7 +199,7 @@ bool Drawmere::isSolved(MoxCommonNS::MoxElement* root) const {
 void Drawmere::keepDocument(const MoxPtr<MoxDocument>& document) {
     const bool isKept = documents.emplace(currentPage, document).second;
     if (isKept && !impl->mayHoldLinks()) {
-        linklessAnchors[currentPage] = impl->getPageAnchors();
+        keptPages[currentPage] = {.isLinkless = true, .anchors = impl->getPageAnchors()};
     }
 }
 

@@ -78,20 +78,15 @@ void Drawmere::finish() {
 
 void Drawmere::finishRun() {
     solveReferences();
-    const bool oneDocument = config->streamOutput || config->singleFile;
-    if (!oneDocument) {
-        writeKeptDocuments();
-    } else if (!documents.empty()) {
-        MoxDocument* first = documents.begin()->second.get();
-        if (config->streamOutput) {
-            writeStream(first);
-        } else {
-            writeFile(first, outputPath);
-        }
+    if (config->streamOutput || config->singleFile) {
+        writeFirstDocument();
+        return;
     }
+    writeKeptDocuments();
     // A page that could not be written must not take the place of an older file.
-    if (!oneDocument && pageCount == 1 && hasWrittenFile && !config->keepPageNumber) {
+    if (pageCount == 1 && hasWrittenFile && !config->keepPageNumber) {
         renameOnlyPage();
+        hasWrittenFile = false;
     }
 }
 
@@ -99,22 +94,52 @@ void Drawmere::solveReferences() {
     SVGReferenceId references;
     references.setRefernceIdInfo(config->singleFile, allAnchors, anchorPages, pageFiles);
     for (const auto& [page, document] : documents) {
-        const auto anchors = linklessAnchors.find(page);
-        if (anchors == linklessAnchors.end()) {
-            references.solveReferenceId(page, document->getDocumentElement());
-            continue;
-        }
-        for (const auto& anchor : anchors->second) {
-            if (standsIn(*document, anchor.get())) {
-                references.solvePageAnchor(anchor.get());
-            }
+        solveDocument(references, page, *document);
+    }
+}
+
+void Drawmere::solveDocument(SVGReferenceId& references, std::int32_t page, MoxDocument& document) {
+    KeptPage& kept = keptPages[page];
+    // Solved again, a document would no longer tell which page its links are on.
+    if (kept.isSolved) {
+        return;
+    }
+    kept.isSolved = true;
+    if (!kept.isLinkless) {
+        references.solveReferenceId(page, document.getDocumentElement());
+        return;
+    }
+    for (const auto& anchor : kept.anchors) {
+        if (standsIn(document, anchor.get())) {
+            references.solvePageAnchor(anchor.get());
         }
     }
 }
 
+void Drawmere::writeFirstDocument() {
+    if (documents.empty()) {
+        return;
+    }
+    const auto& [page, document] = *documents.begin();
+    KeptPage& kept = keptPages[page];
+    if (kept.isWritten) {
+        return;
+    }
+    if (config->streamOutput) {
+        writeStream(document.get());
+    } else {
+        writeFile(document.get(), outputPath);
+    }
+    kept.isWritten = true;
+}
+
 void Drawmere::writeKeptDocuments() {
     for (const auto& [page, document] : documents) {
-        writeFile(document.get(), makePagePath(page));
+        KeptPage& kept = keptPages[page];
+        if (!kept.isWritten) {
+            writeFile(document.get(), makePagePath(page));
+            kept.isWritten = true;
+        }
     }
 }
 

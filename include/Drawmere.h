@@ -33,6 +33,7 @@ class TLGraphicImage;
 namespace DrawmereNS {
 
 class DrawmereImpl;
+class SVGReferenceId;
 
 using MoxCommonNS::MoxColor;
 using MoxCommonNS::MoxDocument;
@@ -104,8 +105,9 @@ public:
     void finishRootSvg();
 
     /// Ends the run: solves the links between kept documents and writes them.
-    /// Failures go to the error handler and end the run; what was written stays. The caller's
-    /// stream is neither flushed nor closed, so what it refuses only then is for the caller to see.
+    /// Failures go to the error handler and end the run; what was written stays. Called again, it
+    /// writes what is not written yet and nothing twice. The caller's stream is neither flushed nor
+    /// closed, so what it refuses only then is for the caller to see.
     void finish();
 
     /// Writes `document` to `stream`, compressed when the configuration says so. Failures stay in
@@ -287,13 +289,23 @@ private:
     void keepDocument(const MoxPtr<MoxDocument>& document);
     void finishRun();
     void solveReferences();
+    void solveDocument(SVGReferenceId& references, std::int32_t page, MoxDocument& document);
+    void writeFirstDocument();
     void writeKeptDocuments();
     void writeStream(MoxDocument* document);
     void renameOnlyPage() const;
 
-    bool hasWrittenFile = false;
-    /// The page anchors of kept documents without links, which need not be searched for.
-    std::map<std::int32_t, std::vector<MoxPtr<MoxCommonNS::MoxElement>>> linklessAnchors;
+    /// What is known of a document that waits for `finish`.
+    struct KeptPage {
+        bool isSolved = false;
+        bool isWritten = false;
+        bool isLinkless = false;
+        /// The page anchors of a document without links, which need not be searched for.
+        std::vector<MoxPtr<MoxCommonNS::MoxElement>> anchors = {};
+    };
+
+    bool hasWrittenFile = false; ///< under the number of its page
+    std::map<std::int32_t, KeptPage> keptPages;
 };
 
 } // namespace DrawmereNS

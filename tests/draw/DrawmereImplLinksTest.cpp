@@ -12,6 +12,19 @@ void drawDot(DrawmereImpl& impl) { impl.drawCircle(pt(1), pt(2), pt(3), PAINTMOD
 
 constexpr char dot[] = "<circle cx=\"1\" cy=\"2\" r=\"3\" fill=\"none\"/>";
 
+/// Tells what comes to where the profiles filter.
+struct FilteringImpl : SVGFullImpl {
+    using SVGFullImpl::SVGFullImpl;
+
+    void addElement(SVGElement* element, bool direct, bool makeCurrent) override {
+        told += utf8(MoxValue(element->getLocalName()).toString()) + (direct ? " direct" : "") +
+                (makeCurrent ? " current" : "") + "\n";
+        SVGFullImpl::addElement(element, direct, makeCurrent);
+    }
+
+    std::string told;
+};
+
 /// Returns: the content of a document with one link.
 std::string drawLink(const UnicodeString& href, const MoxName& show) {
     DrawnTree tree;
@@ -79,6 +92,27 @@ TEST(DrawmereImplLinks, DestinationsArePageContent) {
                                           "<g transform=\"translate(0)\">\n<text id=\"a\"/>\n</g>\n"
                                           "<view viewBox=\"1 2 3 4\" id=\"v\"/>\n") +
                                   dot + "\n</g>\n</a>\n");
+}
+
+TEST(DrawmereImplLinks, GoThroughTheFilterOfTheProfile) {
+    DrawnTree<FilteringImpl> tree;
+    tree.impl.told.clear();
+    tree.impl.startLink(u"u", MoxName());
+    tree.impl.setInternalView(u"v", 1, 2, 3, 4);
+    tree.impl.setInternalLinkAnchor(u"a", 0, 0);
+    tree.impl.endLink();
+    EXPECT_EQ(tree.impl.told, "a direct current\nview\ng\n");
+}
+
+TEST(DrawmereImplLinks, ALinkInALinkStandsInTheRootBesideIt) {
+    DrawnTree tree;
+    tree.impl.startLink(u"outer", MoxName());
+    tree.impl.startLink(u"inner", MoxName());
+    tree.impl.endLink();
+    drawDot(tree.impl);
+    tree.impl.endLink();
+    EXPECT_EQ(tree.content(), std::string("<a xlink:href=\"outer\">\n<g>\n") + dot +
+                                  "\n</g>\n</a>\n<a xlink:href=\"inner\"/>\n");
 }
 
 TEST(DrawmereImplLinks, DestinationsOfNoFiniteNumbersAreWrittenWithZeros) {

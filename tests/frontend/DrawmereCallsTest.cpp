@@ -361,6 +361,17 @@ TEST(DrawmereLinks, AnInternalDestinationThatIsNoMapIsEmpty) {
               "startLink '#' ''\n");
 }
 
+TEST(DrawmereLinks, AnInternalDestinationThatIsNullIsNone) {
+    EXPECT_EQ(startLink(makeMap({{u"internal", MoxValue()}, {u"external", u"out"}})),
+              "startLink 'out' ''\n");
+}
+
+TEST(DrawmereLinks, PageZeroIsAPageAndOneThatIsNoNumberIsPageZero) {
+    EXPECT_EQ(startInternalLink({{u"page", 0}}), "startLink 'Mox-SVG-page-0' ''\n");
+    EXPECT_EQ(startInternalLink({{u"page", -3}}), "startLink 'Mox-SVG-page--3' ''\n");
+    EXPECT_EQ(startInternalLink({{u"page", name(u"x")}}), "startLink 'Mox-SVG-page-0' ''\n");
+}
+
 TEST(DrawmereLinks, OnlyANameShows) {
     EXPECT_EQ(startLink(makeMap({{u"external", u"a"}, {u"show", name(u"new")}})),
               "startLink 'a' 'new'\n");

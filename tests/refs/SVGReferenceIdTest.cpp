@@ -294,6 +294,19 @@ TEST_F(SVGReferenceIdTest, EachPageAnchorSetsThePageForWhatFollows) {
     EXPECT_EQ(solver.currentPage, 7);
 }
 
+TEST_F(SVGReferenceIdTest, PageOfOneDocumentHoldsUntilTheFirstAnchorOfTheNext) {
+    MoxElement* first = add(root, u"g");
+    addAnchor(first, 7);
+    MoxElement* second = add(root, u"g");
+    MoxElement* before = addLink(second, u"#there");
+    addAnchor(second, 3);
+    MoxElement* behind = addLink(second, u"#there");
+    solver.solveReferenceId(7, first);
+    solver.solveReferenceId(3, second);
+    EXPECT_EQ(href(before), "#there");
+    EXPECT_EQ(href(behind), "out7.svg");
+}
+
 TEST_F(SVGReferenceIdTest, CheckDoesNotLookForPageAnchors) {
     addAnchor(root, 9);
     addLink(root, u"#lost");
