@@ -56,7 +56,7 @@ UnicodeString getDestination(int page) { return u"page" + toText(page); }
 UnicodeString getCloseUp(int page) { return u"closeup" + toText(page); }
 
 /// The booklet as it is drawn: into a document for each page, or into one for all, where they stand
-/// below each other.
+/// below each other and the frame shows one at a time.
 struct Booklet {
     Drawmere& drawmere;
     bool isOneDocument;
@@ -267,11 +267,23 @@ void drawColophon(const Booklet& booklet) {
     page.endLink();
 }
 
+/// Where a page is a file, every link from outside leads to its top. In one document it takes a
+/// view to bring another page into the frame: an anchor is an empty text, and viewers don't go to
+/// one.
+void declarePage(const Booklet& booklet, int number) {
+    if (booklet.isOneDocument) {
+        booklet.drawmere.setInternalView(getDestination(number), 0, booklet.getTop(number),
+                                         pageWidth, pageHeight);
+    } else {
+        booklet.drawmere.setInternalLinkAnchor(getDestination(number), 0, 0);
+    }
+}
+
 void drawPage(const Booklet& booklet, int number) {
     Drawmere& page = booklet.drawmere;
     page.setFillColor(paper);
     page.drawRect(pt(0), pt(0), pt(pageWidth), pt(pageHeight), pt(0), pt(0), PAINTMODE_FILL);
-    page.setInternalLinkAnchor(getDestination(number), 0, 0);
+    declarePage(booklet, number);
     if (number == coverPage) {
         drawCover(booklet);
     } else if (number == contentsPage) {
@@ -292,7 +304,7 @@ const MoxRectT<MoxLength> pageArea(pt(0), pt(0), pt(pageWidth), pt(pageHeight));
 
 void drawAllPages(const Booklet& booklet) {
     Drawmere& drawmere = booklet.drawmere;
-    drawmere.setCanvasSize(pt(pageWidth), pt(pageHeight * colophonPage));
+    drawmere.setCanvasSize(pt(pageWidth), pt(pageHeight));
     for (int number = coverPage; number <= colophonPage; ++number) {
         drawmere.pushState();
         drawmere.setTransMatrix(SVGMatrix(1, 0, 0, 1, 0, booklet.getTop(number)));
