@@ -163,6 +163,12 @@ void PlainWriter::addText(std::string_view name, std::string_view value) {
     append("\"");
 }
 
+void PlainWriter::startLink(std::string_view target) {
+    startElement("a");
+    addText("xlink:href", target);
+    append(">");
+}
+
 void PlainWriter::startGroup(const Matrix& matrix) {
     startElement("g");
     startAttribute("transform");

@@ -83,6 +83,11 @@ public:
 
     void endEmptyElement() { append("/>"); }
 
+    /// Opens a link. `target` needs no escapes.
+    void startLink(std::string_view target);
+
+    void endLink() { append("</a>"); }
+
     void startGroup(const Matrix& matrix);
 
     void endGroup() { append("</g>"); }

@@ -244,7 +244,7 @@ void drawIndex(const Booklet& booklet, int number) {
     const int first = (number - indexPage) * lightsOfIndexPage;
     drawHeading(page, u"Index", u"All lights by name");
     for (int i = 0; i < std::min(lightsOfIndexPage, lightCount - first); ++i) {
-        const int light = booklet.lightsByName.at(static_cast<std::size_t>(first + i));
+        const int light = booklet.lightsByName.at(first + i);
         const float x = i < rows ? margin : pageWidth / 2;
         drawLinkToPage(page, getPage(light), {getName(light), x, 98 + 14 * real(i % rows), 8});
     }
@@ -308,9 +308,11 @@ void drawAllPages(const Booklet& booklet) {
     for (int number = coverPage; number <= colophonPage; ++number) {
         drawmere.pushState();
         drawmere.setTransMatrix(SVGMatrix(1, 0, 0, 1, 0, booklet.getTop(number)));
+        drawmere.pushState(); // moves groups from here on, not each element: a view can't be moved
         drawmere.startPage(number, pageArea);
         drawPage(booklet, number);
         drawmere.endPage();
+        drawmere.popState();
         drawmere.popState();
     }
     drawmere.finishRootSvg();

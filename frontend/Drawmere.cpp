@@ -177,12 +177,12 @@ void Drawmere::finishRootSvg() {
 void Drawmere::finishOpenDocument() {
     impl->finishRootSvg();
     const MoxPtr<MoxDocument> document(impl->treeManager->document.get());
-    if (config->streamOutput || config->singleFile) {
+    const bool waits =
+        config->streamOutput || config->singleFile || !isSolved(document->getDocumentElement());
+    if (waits) {
         keepDocument(document);
-    } else if (isSolved(document->getDocumentElement())) {
-        writeFile(document.get(), makePagePath(currentPage));
     } else {
-        keepDocument(document);
+        writeFile(document.get(), makePagePath(currentPage));
     }
     closeImpl();
 }

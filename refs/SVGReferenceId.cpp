@@ -99,13 +99,7 @@ UnicodeString SVGReferenceId::getInternalPageRefernceId(const UnicodeString& mar
 }
 
 bool SVGReferenceId::isSolvedId(const UnicodeString& reference) const {
-    // On purpose: "#" and the mark of a page is an id like any other. The library makes marks
-    // without a "#", and they count as solved since they are no internal destinations.
-    if (!isInternalDestination(reference) || singleFile) {
-        return true;
-    }
-    const int* page = findPage(reference);
-    return page && (*page == currentPage || findFile(*page));
+    return findTarget(reference).isSolved;
 }
 
 bool SVGReferenceId::isSolvedReferenceId(int, MoxElement* element) const {
@@ -121,14 +115,7 @@ bool SVGReferenceId::isSolvedReferenceId(int, MoxElement* element) const {
 }
 
 UnicodeString SVGReferenceId::getDestination(const UnicodeString& reference) const {
-    if (!isInternalDestination(reference) || singleFile) {
-        return reference;
-    }
-    const int* page = findPage(reference);
-    if (!page || *page == currentPage) {
-        return reference;
-    }
-    const UnicodeString* file = findFile(*page);
+    const UnicodeString* const file = findTarget(reference).file;
     return file ? *file : reference;
 }
 
@@ -158,6 +145,20 @@ void SVGReferenceId::setRefernceIdInfo(bool isSingleFile, const std::set<Unicode
     pageFiles = &filesOfPages;
 }
 
+SVGReferenceId::Target SVGReferenceId::findTarget(const UnicodeString& reference) const {
+    // On purpose: "#" and the mark of a page is an id like any other. The library makes marks
+    // without a "#", and they count as solved since they are no internal destinations.
+    if (!isInternalDestination(reference) || singleFile) {
+        return {.isSolved = true};
+    }
+    const int* const page = findPage(reference);
+    if (page && *page == currentPage) {
+        return {.isSolved = true};
+    }
+    const UnicodeString* const file = page ? findFile(*page) : nullptr;
+    return {.isSolved = file != nullptr, .file = file};
+}
+
 /// Returns: the page of an internal destination, null when it is not known.
 const int* SVGReferenceId::findPage(const UnicodeString& reference) const {
     if (!anchorPages) {
@@ -178,14 +179,11 @@ const UnicodeString* SVGReferenceId::findFile(int page) const {
 
 /// Returns: whether the link is solved now.
 bool SVGReferenceId::solveLink(MoxElement& link) const {
-    const UnicodeString href = getAttributeText(link, getHrefName());
-    if (!isSolvedId(href)) {
-        return false;
+    const Target target = findTarget(getAttributeText(link, getHrefName()));
+    if (target.file) {
+        link.setAttribute(getHrefName(), *target.file);
     }
-    if (isInternalDestination(href)) {
-        link.setAttribute(getHrefName(), getDestination(href));
-    }
-    return true;
+    return target.isSolved;
 }
 
 /// Returns: whether the children of the element are to be solved too.

@@ -72,6 +72,13 @@ public:
     int currentPage = 0; ///< of the last page anchor met, 0 before the first
 
 private:
+    /// Where a reference leads.
+    struct Target {
+        bool isSolved = false;
+        const UnicodeString* file = nullptr; ///< borrowed; null when the reference stays as it is
+    };
+
+    Target findTarget(const UnicodeString& reference) const;
     const int* findPage(const UnicodeString& reference) const;
     const UnicodeString* findFile(int page) const;
     bool solveLink(MoxElement& link) const;
