@@ -132,12 +132,21 @@ bool MoxNode::canTake(const MoxNode* child, const MoxNode* ref) const {
         (ref && ref->parent != this)) {
         return false;
     }
-    // Only a node with children can be an ancestor of this one.
-    const MoxNode* ancestor = child->firstChild || child == this ? this : nullptr;
-    while (ancestor && ancestor != child) {
+    return !isAtOrBelow(child) && (kind != MOXNODE_DOCUMENT || hasRoomInDocument(child));
+}
+
+/// Walks up from this node and down from `other` in turn, as the shorter way decides: a small tree
+/// may go far down in a deep one.
+bool MoxNode::isAtOrBelow(const MoxNode* other) const {
+    const MoxNode* ancestor = this;
+    MoxTreeIterator below(other);
+    while (ancestor && below.hasNextNode()) {
+        if (ancestor == other || below.nextNode() == this) {
+            return true;
+        }
         ancestor = ancestor->parent;
     }
-    return !ancestor && (kind != MOXNODE_DOCUMENT || hasRoomInDocument(child));
+    return false;
 }
 
 bool MoxNode::hasRoomInDocument(const MoxNode* child) const {

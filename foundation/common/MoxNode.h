@@ -119,6 +119,7 @@ private:
     struct DocumentLink;
 
     bool canTake(const MoxNode* child, const MoxNode* ref) const;
+    bool isAtOrBelow(const MoxNode* other) const;
     bool hasRoomInDocument(const MoxNode* child) const;
     void link(MoxNode* child, MoxNode* ref);
     void unlink(MoxNode* child);

@@ -151,6 +151,19 @@ TEST_F(MoxNodeTest, RefusesToBecomeItsOwnAncestor) {
     EXPECT_EQ(root->getParentNode(), document.get());
 }
 
+TEST_F(MoxNodeTest, RefusesAnAncestorFarAbove) {
+    constexpr int depth = 1000;
+    MoxNode* bottom = a.get();
+    for (int i = 0; i < depth; ++i) {
+        bottom->appendChild(make(u"beside").get());
+        bottom = bottom->appendChild(make(u"below").get());
+    }
+    EXPECT_EQ(bottom->appendChild(a.get()), nullptr);
+    EXPECT_EQ(bottom->appendChild(root.get()), nullptr);
+    EXPECT_EQ(bottom->appendChild(b.get()), b.get());
+    EXPECT_EQ(childrenOf(*root), "a c");
+}
+
 TEST_F(MoxNodeTest, RefusesAReferenceThatIsNoChild) {
     const MoxPtr<MoxElement> foreign = make(u"foreign");
     const MoxPtr<MoxElement> node = make(u"node");
