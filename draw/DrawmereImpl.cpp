@@ -151,7 +151,7 @@ void DrawmereImpl::finishRootSvg() {
     }
     groupManager->appendToTree();
     MoxElement* root = treeManager->document->getDocumentElement();
-    if (wantsWalk || treeManager->groupsMayBeEmpty) {
+    if (wantsWalk || treeManager->hasEmptyGroup()) {
         SVGOptimizer::optimize(root);
     }
     if (config->svgType == SVGConfig::SVGTYPE_TINY && config->wispMode) {

@@ -5,6 +5,8 @@
 #include "state/SVGGraphicContext.h"
 #include "tree/SVGUtil.h"
 
+#include <algorithm>
+
 namespace DrawmereNS {
 namespace {
 
@@ -52,6 +54,7 @@ SVGTreeManager::~SVGTreeManager() {
     defsElement = nullptr;
     fontStack.clear();
     nodeStack.clear();
+    clipGroups.clear();
     currentNode = nullptr;
     document = nullptr;
 }
@@ -124,7 +127,7 @@ void SVGTreeManager::appendNewGroup(SVGElement* group, bool makeCurrent) {
     if (!canAdd() || !group) {
         return;
     }
-    groupsMayBeEmpty = true;
+    clipGroups.emplace_back(group);
     if (makeCurrent) {
         currentNode->appendChild(group);
     }
@@ -137,6 +140,11 @@ void SVGTreeManager::appendNewGroup(SVGElement* group, bool makeCurrent) {
     if (context) {
         context->setClipPathAttrVal(group, true);
     }
+}
+
+bool SVGTreeManager::hasEmptyGroup() const {
+    return std::any_of(clipGroups.begin(), clipGroups.end(),
+                       [](const MoxPtr<SVGElement>& group) { return !group->hasChildNodes(); });
 }
 
 MoxElement* SVGTreeManager::findDefs(MoxElement* root) {

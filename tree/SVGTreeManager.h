@@ -6,6 +6,7 @@
 #include "tree/SVGDocument.h"
 
 #include <deque>
+#include <vector>
 
 namespace DrawmereNS {
 
@@ -58,6 +59,9 @@ public:
     /// Returns: the element that receives the next one, borrowed; null before there is a root.
     SVGElement* getCurrentNode() const { return currentNode.get(); }
 
+    /// Returns: whether nothing went into some clipping group; no other group is ever empty.
+    bool hasEmptyGroup() const;
+
     /// Who changes its tree from outside asks for it by `DrawmereImpl::getDocument`.
     MoxPtr<SVGDocument> document;
     MoxPtr<SVGElement> currentNode;
@@ -66,7 +70,7 @@ public:
     SVGGraphicContext* context = nullptr; // borrowed
     bool unlocked = true;
     MoxPtr<SVGElement> defsElement;
-    bool groupsMayBeEmpty = false; ///< whether a clipping group came, which nothing may go into
+    std::vector<MoxPtr<SVGElement>> clipGroups; ///< all that came
 
 private:
     bool canAdd() const;

@@ -261,6 +261,17 @@ TEST_F(SVGTreeManagerTest, ANewGroupThatIsNotCurrentIsStampedButNotAppended) {
     EXPECT_EQ(state.groupGC.transMatrix.e, 6.0F); // the current matrix has moved to the group
 }
 
+TEST_F(SVGTreeManagerTest, AnEmptyGroupIsAClippingOneThatNothingWentInto) {
+    EXPECT_FALSE(tree.hasEmptyGroup());
+    const MoxPtr<SVGElement> group = make(SVGName::g);
+    tree.appendNewGroup(group.get(), true);
+    EXPECT_TRUE(tree.hasEmptyGroup());
+    add(SVGName::rect, false);
+    EXPECT_FALSE(tree.hasEmptyGroup());
+    tree.appendNewGroup(make(SVGName::g).get(), false);
+    EXPECT_TRUE(tree.hasEmptyGroup());
+}
+
 TEST_F(SVGTreeManagerTest, ANewGroupNeedsNoContext) {
     const MoxPtr<SVGElement> group = make(SVGName::g);
     tree.appendNewGroup(group.get(), true);
