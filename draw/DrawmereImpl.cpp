@@ -47,6 +47,7 @@ DrawmereImpl::DrawmereImpl(SVGConfig* options) : config(options) {
     groupManager = new SVGGManager(config);
     refIdManager = new SVGRefIDManager;
     groupManager->treeManager = treeManager;
+    treeManager->context = groupManager->getGContext(); // for a clip ahead of any saved state
     fontManager = new SVGFontManager(treeManager);
 }
 

@@ -87,12 +87,18 @@ public:
     /// Adds a closing command to the open path.
     virtual void closePath(bool absolute);
 
-    /// Opens a clip path; what is drawn until `endClipDef` becomes its content.
+    /// Opens a clip path in `defs`; what is drawn until `endClipDef` becomes its content. The units
+    /// are those of its coordinates; an unlisted number is `USERSPACEONUSE`.
+    /// Queues: MoxError 16940 under Tiny, which knows no clip paths.
     virtual void startClipDef(UNITSTYPE units);
-    /// The same, for a clip that every profile can show.
+    /// The same for a rectangle, without the warning.
     virtual void startClipRect(UNITSTYPE units);
+    /// Closes the clip path. The font is the default one then.
+    /// Throws: MoxError 16406 and 16407, as `popState` does.
     virtual void endClipDef();
-    /// Clips what follows by the last clip path.
+    /// Clips what follows by the last clip path, up to the next `popState` of a state saved before.
+    /// With a group open nothing is clipped: the call belongs straight behind `endClipDef`.
+    /// Ignores: a call in a clip path.
     virtual void doClip();
 
     /// Draws a rectangle; `rx` and `ry` round its corners unless both are 0.
@@ -129,25 +135,44 @@ public:
     virtual void startLink(const UnicodeString& href, const MoxName& show);
     virtual void endLink();
 
-    /// Opens a mask. Returns: its id.
+    /// Opens a mask in `defs`; what is drawn until `endMask` becomes its content. The units are
+    /// those of the area and of the content.
+    /// Queues: MoxError 16942 under Tiny. Returns: its id, for `setMaskReference`.
     virtual UnicodeString startMask(MoxLength x, MoxLength y, MoxLength width, MoxLength height,
                                     UNITSTYPE maskUnits, UNITSTYPE contentUnits);
+    /// Closes the mask. The font is the default one then.
+    /// Throws: MoxError 16406 and 16407, as `popState` does.
     virtual void endMask();
 
-    /// Opens a gradient, whose stops follow. Returns: its id.
+    /// Opens a gradient in `defs`, which holds nothing but the stops that follow: whatever else is
+    /// drawn until `endGradiant` is lost. `matrix` applies to its coordinates, `spread` says how it
+    /// goes on beyond its ends; an unlisted number pads. Returns: its id, for `setFillColorId` and
+    /// `setStrokeColorId`.
     virtual UnicodeString startLinearGradient(MoxLength x1, MoxLength y1, MoxLength x2,
                                               MoxLength y2, SVGMatrix matrix, UNITSTYPE units,
                                               GRADSPERADMOD spread);
+    /// The same from the point `fx`, `fy` to a circle.
+    /// Queues: MoxError 16941 under Tiny.
     virtual UnicodeString startRadialGradient(MoxLength cx, MoxLength cy, MoxLength r, MoxLength fx,
                                               MoxLength fy, SVGMatrix matrix, UNITSTYPE units,
                                               GRADSPERADMOD spread);
+    /// Closes the gradient. The font is the default one then.
+    /// Throws: MoxError 16406 and 16407, as `popState` does.
     virtual void endGradiant(); // sic
+    /// Adds a stop to the open gradient. Offsets and opacities are written as they are, in the
+    /// order of the calls. Ignores: a call outside a gradient.
     virtual void setStopColor(const MoxColor& color, float offset, float opacity);
 
-    /// Opens a pattern, whose content follows. Returns: its id.
+    /// Opens a pattern in `defs`; what is drawn until `endPattern` becomes its content. `area` is a
+    /// tile, by any two opposite corners; `viewArea`, by its corner and the opposite one, is the
+    /// part of the content that fills it. The units are those of the tile and of the content.
+    /// Queues: MoxError 16943 under Tiny. Returns: its id, for `setFillColorId` and
+    /// `setStrokeColorId`.
     virtual UnicodeString startPattern(const MoxRectT<MoxLength>& area,
                                        const MoxRectT<MoxLength>& viewArea, SVGMatrix matrix,
                                        UNITSTYPE patternUnits, UNITSTYPE contentUnits);
+    /// Closes the pattern. The font is the default one then.
+    /// Throws: MoxError 16406 and 16407, as `popState` does.
     virtual void endPattern();
 
     /// Sends an element where it belongs: page content to the open group, and with `direct`, as
@@ -218,6 +243,9 @@ public:
 protected:
     MoxPtr<SVGElement> createElement(SVGName name) const;
 
+    /// Queues the text of `code`, one of 16428 to 16431, when the output is to be Tiny.
+    void warnUnderTiny(unsigned short code) const;
+
 private:
     void finishShape(SVGElement* element, PAINTMODE mode);
     void closePathManager();
@@ -225,6 +253,11 @@ private:
     void registerText(const UnicodeString& text, TLStringWithGlyphInfo* glyphs, bool wholeRun);
     void setViewBox(SVGElement* root, MoxLength width, MoxLength height) const;
     void setFillAttr(SVGElement& element, const GraphicContext& state, PAINTMODE mode) const;
+    void openDefinition(SVGElement* element, ELEMENT_TYPE type);
+    void openClipPath(UNITSTYPE units);
+    void openGradient(SVGElement* gradient);
+    UnicodeString setGradientAttrs(SVGElement& gradient, const SVGMatrix& matrix, UNITSTYPE units,
+                                   GRADSPERADMOD spread);
 
     bool hasLinks = false;
     bool wantsWalk =

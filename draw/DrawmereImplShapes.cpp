@@ -1,5 +1,6 @@
 // The shape calls: one element each, its geometry, then the common tail.
 #include "draw/DrawmereImpl.h"
+#include "draw/ElementAttributes.h"
 #include "foundation/common/MoxNumberText.h"
 #include "state/SVGGroupManager.h"
 
@@ -7,12 +8,6 @@
 
 namespace DrawmereNS {
 namespace {
-
-using MoxCommonNS::MOXUNIT_POINT;
-
-void setLength(SVGElement& element, SVGName name, MoxLength length) {
-    element.setSVGAttribute(name, MoxValue(length.getRealValue(MOXUNIT_POINT)));
-}
 
 void appendReal(std::string& text, float number, char separator) {
     char digits[MoxCommonNS::maxRealText];

@@ -191,11 +191,18 @@ public:
 
     // Clips.
 
-    /// Opens a clip path; what is drawn until `endClipDef` becomes its content.
+    /// Opens a clip path; what is drawn until `endClipDef` becomes its content. Give it one shape
+    /// in final coordinates: a second path or a text loses its transform, and a text is drawn in
+    /// the font of the root and the size of the viewer. Set the font again after the end. Queues:
+    /// MoxError 16940 under Tiny.
     void startClipDef(UNITSTYPE units);
+    /// The same for a rectangle; it queues nothing.
     void startClipRect(UNITSTYPE units);
+    /// Throws: MoxError 16406 or 16407 when no clip path was opened last; so do the other ends of
+    /// definitions.
     void endClipDef();
-    /// Clips what follows by the last clip path.
+    /// Clips what follows by the last clip path, until a state saved before is taken back. Call it
+    /// straight after `endClipDef`: with a group open nothing is clipped.
     void doClip();
 
     // Shapes.
@@ -229,10 +236,15 @@ public:
     // Patterns, masks and gradients. Each start call returns the id under which the definition can
     // be used as a paint or mask. Set the font again after the end call.
 
+    /// Opens a pattern; what is drawn until `endPattern` becomes its content. `area` is a tile, by
+    /// any two opposite corners, `viewArea` the part of the content that fills it, from its first
+    /// corner to the second.
     UnicodeString startPattern(const MoxRectT<MoxLength>& area, const MoxRectT<MoxLength>& viewArea,
                                SVGMatrix matrix, UNITSTYPE patternUnits, UNITSTYPE contentUnits);
+    /// Opens a mask; what is drawn until `endMask` becomes its content.
     UnicodeString startMask(MoxLength x, MoxLength y, MoxLength width, MoxLength height,
                             UNITSTYPE maskUnits, UNITSTYPE contentUnits);
+    /// Opens a gradient, for stops alone: whatever else is drawn until `endGradiant` is lost.
     UnicodeString startLinearGradient(MoxLength x1, MoxLength y1, MoxLength x2, MoxLength y2,
                                       SVGMatrix matrix, UNITSTYPE units, GRADSPERADMOD spread);
     UnicodeString startLinearGradient(const MoxPointT<MoxLength>& from,
@@ -241,7 +253,8 @@ public:
     UnicodeString startRadialGradient(MoxLength cx, MoxLength cy, MoxLength r, MoxLength fx,
                                       MoxLength fy, SVGMatrix matrix, UNITSTYPE units,
                                       GRADSPERADMOD spread);
-    /// Adds a stop at `offset`, 0 to 1, with an opacity of its own.
+    /// Adds a stop at `offset`, 0 to 1, with an opacity of its own; nothing is clamped or sorted.
+    /// Ignores: a call outside a gradient.
     void setStopColor(const MoxColor& color, float offset, float opacity);
     void endGradiant(); // sic
     void endMask();
