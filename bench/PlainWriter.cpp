@@ -169,6 +169,12 @@ void PlainWriter::startLink(std::string_view target) {
     append(">");
 }
 
+void PlainWriter::endElement(std::string_view name) {
+    append("</");
+    append(name);
+    append(">");
+}
+
 void PlainWriter::startGroup(const Matrix& matrix) {
     startElement("g");
     startAttribute("transform");

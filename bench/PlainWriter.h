@@ -88,6 +88,11 @@ public:
 
     void endLink() { append("</a>"); }
 
+    /// Ends the start tag of an element that has content.
+    void openElement() { append(">"); }
+
+    void endElement(std::string_view name);
+
     void startGroup(const Matrix& matrix);
 
     void endGroup() { append("</g>"); }

@@ -11,6 +11,11 @@ double channel(std::uint32_t rgb, unsigned int shift) {
     return static_cast<double>(rgb >> shift & 0xFFU) / 255.0;
 }
 
+void addStop(cairo_pattern_t* pattern, double offset, std::uint32_t rgb) {
+    cairo_pattern_add_color_stop_rgb(pattern, offset, channel(rgb, 16), channel(rgb, 8),
+                                     channel(rgb, 0));
+}
+
 } // namespace
 
 CairoPeer::CairoPeer(const std::string& path, float width, float height)
@@ -39,6 +44,22 @@ void CairoPeer::fillAndStrokeRect(float x, float y, float width, float height) {
     cairo_fill_preserve(context);
     setSource(strokeColor);
     cairo_stroke(context);
+}
+
+void CairoPeer::clipRect(float x, float y, float width, float height) {
+    addRect(x, y, width, height);
+    cairo_clip(context);
+}
+
+void CairoPeer::fillRect(float x, float y, float width, float height, std::uint32_t left,
+                         std::uint32_t right) {
+    cairo_pattern_t* pattern = cairo_pattern_create_linear(wide(x), 0.0, wide(x + width), 0.0);
+    addStop(pattern, 0.0, left);
+    addStop(pattern, 1.0, right);
+    addRect(x, y, width, height);
+    cairo_set_source(context, pattern);
+    cairo_pattern_destroy(pattern);
+    cairo_fill(context);
 }
 
 void CairoPeer::moveTo(float x, float y) { cairo_move_to(context, wide(x), wide(y)); }

@@ -32,6 +32,13 @@ public:
     void strokeRect(float x, float y, float width, float height);
     void fillAndStrokeRect(float x, float y, float width, float height);
 
+    /// Clips what follows, up to the next `restore`.
+    void clipRect(float x, float y, float width, float height);
+
+    /// Fills a rectangle with a gradient from its left edge to its right one.
+    void fillRect(float x, float y, float width, float height, std::uint32_t left,
+                  std::uint32_t right);
+
     // A path: started with a move and stroked.
     void moveTo(float x, float y);
     void lineTo(float x, float y);
