@@ -58,12 +58,15 @@ int channelDifference(std::uint32_t one, std::uint32_t other) {
 
 } // namespace
 
-Picture::Picture(const std::string& svg) {
-    const Surface surface = renderFile(svg);
-    width = cairo_image_surface_get_width(surface.get());
-    height = cairo_image_surface_get_height(surface.get());
-    const int stride = cairo_image_surface_get_stride(surface.get());
-    const unsigned char* rows = cairo_image_surface_get_data(surface.get());
+Picture::Picture(const std::string& svg) { readPixels(renderFile(svg).get()); }
+
+Picture::Picture(cairo_surface_t* surface) { readPixels(surface); }
+
+void Picture::readPixels(cairo_surface_t* surface) {
+    width = cairo_image_surface_get_width(surface);
+    height = cairo_image_surface_get_height(surface);
+    const int stride = cairo_image_surface_get_stride(surface);
+    const unsigned char* rows = cairo_image_surface_get_data(surface);
     pixels.resize(static_cast<std::size_t>(width) * static_cast<std::size_t>(height));
     for (int row = 0; row < height; ++row) {
         std::memcpy(pixels.data() + static_cast<std::size_t>(row) * static_cast<std::size_t>(width),
@@ -96,6 +99,21 @@ testing::AssertionResult Picture::looksLike(const Picture& other) const {
 int Picture::countInk() const {
     return static_cast<int>(std::count_if(pixels.begin(), pixels.end(),
                                           [](std::uint32_t pixel) { return pixel != white; }));
+}
+
+double Picture::differenceShare(const Picture& other, const PixelBox& box, int tolerance) const {
+    int count = 0;
+    for (int y = box.y; y < box.y + box.height; ++y) {
+        for (int x = box.x; x < box.x + box.width; ++x) {
+            const auto one = static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
+            const auto two = static_cast<std::size_t>(y) * static_cast<std::size_t>(other.width);
+            const auto column = static_cast<std::size_t>(x);
+            const int difference =
+                channelDifference(pixels.at(one + column), other.pixels.at(two + column));
+            count += difference > tolerance ? 1 : 0;
+        }
+    }
+    return static_cast<double>(count) / (box.width * box.height);
 }
 
 } // namespace DrawmereTest
