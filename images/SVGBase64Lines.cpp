@@ -1,0 +1,156 @@
+#include "images/SVGBase64Lines.h"
+
+#include "images/SVGBase64.h"
+
+#if defined(__x86_64__) && defined(__GNUC__)
+#define DRAWMERE_VECTOR_BASE64
+#include <immintrin.h>
+#endif
+
+namespace DrawmereNS {
+namespace {
+
+constexpr std::size_t tripleBytes = 3;
+
+unsigned int toBits(char byte) { return static_cast<unsigned char>(byte); }
+
+void encodePlain(const char* in, std::size_t lines, char* out) {
+    const char* const alphabet = SVGBase64::BASE64_ALPHABET;
+    for (std::size_t line = 0; line < lines; ++line) {
+        for (std::size_t i = 0; i < SVGBase64Lines::lineBytes; i += tripleBytes) {
+            const unsigned int bits =
+                toBits(in[i]) << 16U | toBits(in[i + 1]) << 8U | toBits(in[i + 2]);
+            *out++ = alphabet[bits >> 18U];
+            *out++ = alphabet[bits >> 12U & 0x3FU];
+            *out++ = alphabet[bits >> 6U & 0x3FU];
+            *out++ = alphabet[bits & 0x3FU];
+        }
+        *out++ = '\n';
+        in += SVGBase64Lines::lineBytes;
+    }
+}
+
+bool isAlwaysSupported() { return true; }
+
+#ifdef DRAWMERE_VECTOR_BASE64
+
+// Both vector encoders work alike. A shuffle puts the three bytes of each group into the four bytes
+// that it becomes, two multiplications move the fields of six bits into place, and the distance
+// from a field to its character comes from a table of sixteen: fields from 52 on and their excess
+// over 51 choose a row, those below 26 the row 13, all others the row 0. A line is no whole number
+// of vectors, so the last one overlaps the one before it.
+
+#define DRAWMERE_FIELD_SHUFFLE(first)                                                              \
+    first + 1, first, first + 2, first + 1, first + 4, first + 3, first + 5, first + 4, first + 7, \
+        first + 6, first + 8, first + 7, first + 10, first + 9, first + 11, first + 10
+#define DRAWMERE_CHARACTER_SHIFTS                                                                  \
+    'a' - 26, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52,      \
+        '0' - 52, '0' - 52, '+' - 62, '/' - 63, 'A', 0, 0
+
+constexpr int upperFieldMask = 0x0fc0fc00;
+constexpr int upperFieldShift = 0x04000040; // to the right, as the high half of a product
+constexpr int lowerFieldMask = 0x003f03f0;
+constexpr int lowerFieldShift = 0x01000010;
+
+__attribute__((target("ssse3"))) inline __m128i encodeShuffled(__m128i bytes) {
+    const __m128i upper = _mm_mulhi_epu16(_mm_and_si128(bytes, _mm_set1_epi32(upperFieldMask)),
+                                          _mm_set1_epi32(upperFieldShift));
+    const __m128i lower = _mm_mullo_epi16(_mm_and_si128(bytes, _mm_set1_epi32(lowerFieldMask)),
+                                          _mm_set1_epi32(lowerFieldShift));
+    const __m128i fields = _mm_or_si128(upper, lower);
+    const __m128i isCapital = _mm_cmpgt_epi8(_mm_set1_epi8(26), fields);
+    const __m128i rows = _mm_or_si128(_mm_subs_epu8(fields, _mm_set1_epi8(51)),
+                                      _mm_and_si128(isCapital, _mm_set1_epi8(13)));
+    const __m128i shifts = _mm_shuffle_epi8(_mm_setr_epi8(DRAWMERE_CHARACTER_SHIFTS), rows);
+    return _mm_add_epi8(fields, shifts);
+}
+
+__attribute__((target("ssse3"))) inline __m128i loadVector(const char* in) {
+    return _mm_loadu_si128(reinterpret_cast<const __m128i*>(in));
+}
+
+__attribute__((target("ssse3"))) void encodeSsse3(const char* in, std::size_t lines, char* out) {
+    const __m128i shuffle = _mm_setr_epi8(DRAWMERE_FIELD_SHUFFLE(0));
+    const __m128i endShuffle = _mm_setr_epi8(DRAWMERE_FIELD_SHUFFLE(4));
+    for (std::size_t line = 0; line < lines; ++line) {
+        for (int i = 0; i < 4; ++i) {
+            const __m128i bytes = _mm_shuffle_epi8(loadVector(in + 12 * i), shuffle);
+            _mm_storeu_si128(reinterpret_cast<__m128i*>(out + 16 * i), encodeShuffled(bytes));
+        }
+        // Bytes 45 to 57, read together with the four before them: behind them there may be none.
+        const __m128i bytes = _mm_shuffle_epi8(loadVector(in + 41), endShuffle);
+        _mm_storeu_si128(reinterpret_cast<__m128i*>(out + 60), encodeShuffled(bytes));
+        out[SVGBase64Lines::lineCharacters] = '\n';
+        in += SVGBase64Lines::lineBytes;
+        out += SVGBase64Lines::lineSize;
+    }
+}
+
+bool isSsse3Supported() { return __builtin_cpu_supports("ssse3") != 0; }
+
+__attribute__((target("avx2"))) inline __m256i encodeShuffled(__m256i bytes) {
+    const __m256i upper =
+        _mm256_mulhi_epu16(_mm256_and_si256(bytes, _mm256_set1_epi32(upperFieldMask)),
+                           _mm256_set1_epi32(upperFieldShift));
+    const __m256i lower =
+        _mm256_mullo_epi16(_mm256_and_si256(bytes, _mm256_set1_epi32(lowerFieldMask)),
+                           _mm256_set1_epi32(lowerFieldShift));
+    const __m256i fields = _mm256_or_si256(upper, lower);
+    const __m256i isCapital = _mm256_cmpgt_epi8(_mm256_set1_epi8(26), fields);
+    const __m256i rows = _mm256_or_si256(_mm256_subs_epu8(fields, _mm256_set1_epi8(51)),
+                                         _mm256_and_si256(isCapital, _mm256_set1_epi8(13)));
+    const __m256i table = _mm256_setr_epi8(DRAWMERE_CHARACTER_SHIFTS, DRAWMERE_CHARACTER_SHIFTS);
+    return _mm256_add_epi8(fields, _mm256_shuffle_epi8(table, rows));
+}
+
+/// Encodes 24 bytes; the upper half is read with the four bytes before it, so nothing behind is.
+__attribute__((target("avx2"))) inline void encodeVector(const char* in, char* out) {
+    const __m256i shuffle = _mm256_setr_epi8(DRAWMERE_FIELD_SHUFFLE(0), DRAWMERE_FIELD_SHUFFLE(4));
+    const __m256i bytes = _mm256_inserti128_si256(
+        _mm256_castsi128_si256(_mm_loadu_si128(reinterpret_cast<const __m128i*>(in))),
+        _mm_loadu_si128(reinterpret_cast<const __m128i*>(in + 8)), 1);
+    _mm256_storeu_si256(reinterpret_cast<__m256i*>(out),
+                        encodeShuffled(_mm256_shuffle_epi8(bytes, shuffle)));
+}
+
+__attribute__((target("avx2"))) void encodeAvx2(const char* in, std::size_t lines, char* out) {
+    for (std::size_t line = 0; line < lines; ++line) {
+        encodeVector(in, out);
+        encodeVector(in + 24, out + 32);
+        encodeVector(in + 33, out + 44);
+        out[SVGBase64Lines::lineCharacters] = '\n';
+        in += SVGBase64Lines::lineBytes;
+        out += SVGBase64Lines::lineSize;
+    }
+}
+
+bool isAvx2Supported() { return __builtin_cpu_supports("avx2") != 0; }
+
+#endif
+
+constexpr SVGBase64Lines::Variant variants[] = {
+#ifdef DRAWMERE_VECTOR_BASE64
+    {"avx2", encodeAvx2, isAvx2Supported},
+    {"ssse3", encodeSsse3, isSsse3Supported},
+#endif
+    {"plain", encodePlain, isAlwaysSupported},
+};
+
+SVGBase64Lines::Encoder findFastest() {
+    const SVGBase64Lines::Variant* variant = variants;
+    while (!variant->isSupported()) {
+        ++variant;
+    }
+    return variant->encode;
+}
+
+} // namespace
+
+std::span<const SVGBase64Lines::Variant> SVGBase64Lines::getVariants() { return variants; }
+
+void SVGBase64Lines::encode(const char* in, std::size_t lines, char* out) {
+    static const Encoder fastest = findFastest();
+    fastest(in, lines, out);
+}
+
+} // namespace DrawmereNS

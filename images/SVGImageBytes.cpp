@@ -1,0 +1,24 @@
+#include "images/SVGImageBytes.h"
+
+#include <istream>
+
+namespace DrawmereNS {
+
+std::size_t SVGImageBytes::start(std::istream& source) {
+    std::streambuf* const buffer = source.rdbuf();
+    if (!buffer) {
+        return 0;
+    }
+    const std::streamoff length = buffer->pubseekoff(0, std::ios::end, std::ios::in);
+    const std::streamoff begin = buffer->pubseekoff(0, std::ios::beg, std::ios::in);
+    return length > 0 && begin == 0 ? static_cast<std::size_t>(length) : 0;
+}
+
+std::size_t SVGImageBytes::read(std::istream& source, char* bytes, std::size_t count) {
+    std::streambuf* const buffer = source.rdbuf();
+    const std::streamsize read =
+        buffer ? buffer->sgetn(bytes, static_cast<std::streamsize>(count)) : 0;
+    return read > 0 ? static_cast<std::size_t>(read) : 0;
+}
+
+} // namespace DrawmereNS

@@ -1,0 +1,22 @@
+/// Reading the bytes of an image, whatever state its stream is in.
+#pragma once
+
+#include <cstddef>
+#include <iosfwd>
+
+namespace DrawmereNS {
+
+/// Reads streams by their buffers: an earlier reader may have met the end and left its mark in the
+/// state of the stream, and a stream that throws on failure must not end the run.
+class SVGImageBytes {
+public:
+    SVGImageBytes() = delete;
+
+    /// Goes to the first byte. Returns: the count of bytes, 0 when the stream can't tell.
+    static std::size_t start(std::istream& source);
+
+    /// Returns: how many of the next `count` bytes there were; they stand in `bytes`.
+    static std::size_t read(std::istream& source, char* bytes, std::size_t count);
+};
+
+} // namespace DrawmereNS
