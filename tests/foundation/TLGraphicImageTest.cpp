@@ -56,9 +56,3 @@ TEST(TLGraphicImage, DerivedImageDiesThroughItsBase) {
     delete image;
     EXPECT_EQ(SmallImage::destroyedCount, before + 1);
 }
-
-TEST(TLGraphicImage, TypesHaveTheNumbersOfTheCallers) {
-    EXPECT_EQ(static_cast<int>(TLGRAPHICTYPE_PNG), 2);
-    EXPECT_EQ(static_cast<int>(TLGRAPHICTYPE_JPEG), 5);
-    EXPECT_EQ(static_cast<int>(TLGRAPHICTYPE_SVG), 9);
-}
