@@ -33,6 +33,12 @@ struct MoxValue::HeapText {
     }
 };
 
+/// A text in a block that came from outside.
+struct MoxValue::AdoptedText {
+    MoxByteBlock block;
+    std::string_view text; // in the block
+};
+
 namespace {
 
 const MoxNamedValueMap& emptyMap() {
@@ -138,6 +144,14 @@ MoxValue MoxValue::fromAscii(std::string_view text) {
     return result;
 }
 
+MoxValue MoxValue::adoptAscii(MoxByteBlock block, std::size_t begin, std::size_t length) {
+    MoxValue result;
+    const std::string_view text(block.get() + begin, length);
+    result.store(MOXVALUE_STRING, new AdoptedText{std::move(block), text});
+    result.form = adoptedForm;
+    return result;
+}
+
 void MoxValue::storeAscii(std::string_view text) {
     type = MOXVALUE_STRING;
     if (text.size() <= inlineCapacity) {
@@ -163,6 +177,10 @@ void MoxValue::cloneHeap() {
         store(MOXVALUE_MAP, new MoxNamedValueMap(*load<MoxNamedValueMap*>()));
         return;
     }
+    if (form == adoptedForm) {
+        storeAscii(load<AdoptedText*>()->text);
+        return;
+    }
     HeapText* source = load<HeapText*>();
     const std::size_t unitSize = form == wideForm ? sizeof(char16_t) : sizeof(char);
     HeapText* copy = HeapText::make(source->length, unitSize);
@@ -173,6 +191,8 @@ void MoxValue::cloneHeap() {
 void MoxValue::freeHeap() {
     if (form == mapForm) {
         delete load<MoxNamedValueMap*>();
+    } else if (form == adoptedForm) {
+        delete load<AdoptedText*>();
     } else {
         std::free(load<HeapText*>());
     }
@@ -182,6 +202,9 @@ std::string_view MoxValue::getAsciiText() const {
     if (form == asciiForm) {
         auto* heap = load<HeapText*>();
         return {heap->units<char>(), heap->length};
+    }
+    if (form == adoptedForm) {
+        return load<AdoptedText*>()->text;
     }
     return type == MOXVALUE_STRING && form <= inlineCapacity ? std::string_view(bytes, form)
                                                              : std::string_view();

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "DrawmereExport.h"
+#include "foundation/common/MoxByteBlock.h"
 #include "foundation/common/MoxColor.h"
 #include "foundation/common/MoxLength.h"
 #include "foundation/common/MoxName.h"
@@ -97,6 +98,11 @@ public:
     /// are taken as the characters of that number.
     static MoxValue fromAscii(std::string_view text);
 
+    /// A string value whose text lies in `block` already, for a text too large to be copied: it
+    /// stays where it is, and only a copy of the value has its own.
+    /// Shape: `length` bytes from `begin` on, all of them ASCII; their count fits into an int.
+    static MoxValue adoptAscii(MoxByteBlock block, std::size_t begin, std::size_t length);
+
     /// True when type and content agree; the key plays no part, and a NaN differs from everything.
     bool operator==(const MoxValue& other) const;
 
@@ -151,10 +157,12 @@ public:
     float getFloat() const { return load<float>(); }
 
 private:
+    struct AdoptedText;
     struct HeapText;
 
     static constexpr std::size_t inlineCapacity = 10;
-    static constexpr std::uint8_t firstHeapForm = 0xFD;
+    static constexpr std::uint8_t firstHeapForm = 0xFC;
+    static constexpr std::uint8_t adoptedForm = 0xFC;
     static constexpr std::uint8_t mapForm = 0xFD;
     static constexpr std::uint8_t asciiForm = 0xFE;
     static constexpr std::uint8_t wideForm = 0xFF;

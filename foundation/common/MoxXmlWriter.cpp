@@ -3,6 +3,7 @@
 #include "foundation/common/MoxNumberText.h"
 #include "foundation/common/MoxText.h"
 #include "foundation/common/MoxXmlChars.h"
+#include "foundation/common/MoxXmlScan.h"
 #include "foundation/common/MoxXmlUtil.h"
 
 #include <algorithm>
@@ -327,12 +328,15 @@ void MoxXmlWriter::writeText(const MoxValue& text, bool inAttribute) {
 
 void MoxXmlWriter::writeAscii(std::string_view text, bool inAttribute) {
     std::size_t start = 0;
-    for (std::size_t i = 0; i < text.size(); ++i) {
-        if (isSpecial(static_cast<unsigned char>(text[i]), inAttribute)) {
+    std::size_t i = findXmlMarkup(text, 0);
+    while (i < text.size()) {
+        const auto c = static_cast<unsigned char>(text[i]);
+        if (isSpecial(c, inAttribute)) {
             sink.write(text.substr(start, i - start));
-            writeEscaped(static_cast<unsigned char>(text[i]), inAttribute);
+            writeEscaped(c, inAttribute);
             start = i + 1;
         }
+        i = findXmlMarkup(text, i + 1);
     }
     sink.write(text.substr(start));
 }

@@ -142,6 +142,46 @@ TEST(MoxValue, IsMadeFromAsciiBytesToo) {
     EXPECT_TRUE(MoxValue::fromAscii("\x80").isWideText());
 }
 
+/// Returns: a value that took over a block with `text` in its middle.
+MoxValue adopt(std::string_view text) {
+    MoxByteBlock block = makeZeroBlock(text.size() + 8);
+    std::copy(text.begin(), text.end(), block.get() + 5);
+    return MoxValue::adoptAscii(std::move(block), 5, text.size());
+}
+
+TEST(MoxValue, TakesOverATextThatLiesReady) {
+    MoxByteBlock block = makeZeroBlock(100);
+    const char* const bytes = block.get();
+    const MoxValue value = MoxValue::adoptAscii(std::move(block), 3, 50);
+    EXPECT_EQ(value.getAsciiText().data(), bytes + 3);
+    EXPECT_EQ(value.getAsciiText().size(), 50U);
+    EXPECT_EQ(value.getType(), MOXVALUE_STRING);
+    EXPECT_FALSE(value.isWideText());
+}
+
+TEST(MoxValue, AdoptedTextIsATextLikeAnyOther) {
+    for (const char* const text : {"", "short", "0123456789", "longer than what fits inside"}) {
+        EXPECT_EQ(adopt(text), MoxValue::fromAscii(text));
+        EXPECT_EQ(adopt(text).toString(), UnicodeString(text));
+    }
+    EXPECT_NE(adopt("one"), MoxValue(u"other"));
+    EXPECT_EQ(adopt("12pt").getRealValue(MOXUNIT_POINT), 12.0F);
+}
+
+TEST(MoxValue, CopyOfAnAdoptedTextOutlivesIt) {
+    for (const char* const text : {"short", "longer than what fits inside"}) {
+        MoxValue copy;
+        {
+            MoxValue original = adopt(text);
+            copy = original;
+            EXPECT_NE(copy.getAsciiText().data(), original.getAsciiText().data());
+            const MoxValue moved(std::move(original));
+            EXPECT_EQ(moved, copy);
+        }
+        EXPECT_EQ(copy, MoxValue::fromAscii(text));
+    }
+}
+
 TEST(MoxValue, IsEqualWhenTypeAndContentAgree) {
     const std::vector<MoxValue> values = makeAllKinds();
     const std::vector<MoxValue> same = makeAllKinds();
