@@ -199,7 +199,8 @@ int SVGBase64::encodeStream2Buffer(std::istream& source, char* out, unsigned lon
     if (!out || outSize == 0) {
         return SUCCESS;
     }
-    std::size_t left = SVGImageBytes::start(source);
+    const std::streamoff length = SVGImageBytes::start(source);
+    std::size_t left = length > 0 ? static_cast<std::size_t>(length) : 0;
     const auto read = [&source, &left](char* bytes, std::size_t count) {
         const std::size_t found = SVGImageBytes::read(source, bytes, std::min(count, left));
         left -= found;

@@ -4,14 +4,14 @@
 
 namespace DrawmereNS {
 
-std::size_t SVGImageBytes::start(std::istream& source) {
+std::streamoff SVGImageBytes::start(std::istream& source) {
     std::streambuf* const buffer = source.rdbuf();
     if (!buffer) {
-        return 0;
+        return -1;
     }
     const std::streamoff length = buffer->pubseekoff(0, std::ios::end, std::ios::in);
     const std::streamoff begin = buffer->pubseekoff(0, std::ios::beg, std::ios::in);
-    return length > 0 && begin == 0 ? static_cast<std::size_t>(length) : 0;
+    return begin == 0 ? length : -1;
 }
 
 std::size_t SVGImageBytes::read(std::istream& source, char* bytes, std::size_t count) {

@@ -2,7 +2,7 @@
 #pragma once
 
 #include <cstddef>
-#include <iosfwd>
+#include <ios>
 
 namespace DrawmereNS {
 
@@ -12,8 +12,8 @@ class SVGImageBytes {
 public:
     SVGImageBytes() = delete;
 
-    /// Goes to the first byte. Returns: the count of bytes, 0 when the stream can't tell.
-    static std::size_t start(std::istream& source);
+    /// Goes to the first byte. Returns: the count of bytes, -1 when the stream can't tell.
+    static std::streamoff start(std::istream& source);
 
     /// Returns: how many of the next `count` bytes there were; they stand in `bytes`.
     static std::size_t read(std::istream& source, char* bytes, std::size_t count);
