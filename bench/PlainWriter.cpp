@@ -1,5 +1,6 @@
 #include "bench/PlainWriter.h"
 
+#include <array>
 #include <charconv>
 #include <cstring>
 
@@ -12,12 +13,28 @@ namespace {
 constexpr std::size_t bufferSize = std::size_t{1} << 20U;
 constexpr std::size_t maxNumber = 64; // a float has 39 digits before the point
 constexpr int decimals = 3;
+constexpr std::size_t imageChunk = std::size_t{3} << 14U;
 
 char* dropTrailingZeros(char* end) {
     while (end[-1] == '0') {
         --end;
     }
     return end[-1] == '.' ? end - 1 : end;
+}
+
+using Pair = std::array<char, 2>;
+
+/// Returns: the two characters of base64 for each number of twelve bits.
+std::vector<Pair> makePairs() {
+    constexpr std::string_view alphabet =
+        "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
+    std::vector<Pair> pairs;
+    for (const char first : alphabet) {
+        for (const char second : alphabet) {
+            pairs.push_back({first, second});
+        }
+    }
+    return pairs;
 }
 
 } // namespace
@@ -134,6 +151,44 @@ void PlainWriter::drawText(std::string_view text, std::span<const float> x, floa
     append(">");
     append(text);
     append("</text>");
+}
+
+void PlainWriter::drawImage(const std::string& imagePath, float x, float y, float width,
+                            float height) {
+    startElement("image");
+    addNumber("x", x + state.shiftX);
+    addNumber("y", y + state.shiftY);
+    addNumber("width", width);
+    addNumber("height", height);
+    startAttribute("href");
+    append("data:image/png;base64,");
+    const int source = open(imagePath.c_str(), O_RDONLY | O_CLOEXEC);
+    const std::unique_ptr<unsigned char[]> bytes(new unsigned char[imageChunk]);
+    ssize_t count = 0;
+    while ((count = read(source, bytes.get(), imageChunk)) > 0) {
+        appendBase64(bytes.get(), static_cast<std::size_t>(count));
+    }
+    failed = close(source) != 0 || count < 0 || failed;
+    append("\"");
+    endEmptyElement();
+}
+
+/// Two characters at a time by a table. All chunks but the last are whole triples.
+void PlainWriter::appendBase64(const unsigned char* bytes, std::size_t count) {
+    static const std::vector<Pair> pairs = makePairs();
+    char* out = room(count / 3 * 4 + 4);
+    for (; count >= 3; count -= 3, bytes += 3, out += 4) {
+        std::memcpy(out, &pairs[bytes[0] << 4U | bytes[1] >> 4U], 2);
+        std::memcpy(out + 2, &pairs[(bytes[1] & 0xFU) << 8U | bytes[2]], 2);
+    }
+    if (count > 0) {
+        const unsigned int second = count > 1 ? bytes[1] : 0U;
+        std::memcpy(out, &pairs[bytes[0] << 4U | second >> 4U], 2);
+        out[2] = count > 1 ? pairs[(second & 0xFU) << 8U][0] : '=';
+        out[3] = '=';
+        out += 4;
+    }
+    cursor = out;
 }
 
 void PlainWriter::startElement(std::string_view name) {

@@ -75,6 +75,9 @@ public:
     /// Writes a run of text at one x or one for each character. `text` needs no escapes.
     void drawText(std::string_view text, std::span<const float> x, float y);
 
+    /// Writes an image with the bytes of a PNG file in base64, without line feeds.
+    void drawImage(const std::string& imagePath, float x, float y, float width, float height);
+
     // Markup as it stands: an element is started, gets its attributes, and is ended.
     void startElement(std::string_view name);
     void addNumber(std::string_view name, float value);
@@ -111,6 +114,7 @@ private:
     void appendPoint(float x, float y);
     void startAttribute(std::string_view name);
     void addPaint(Paint paint);
+    void appendBase64(const unsigned char* bytes, std::size_t count);
     char* room(std::size_t count);
     void flush();
 

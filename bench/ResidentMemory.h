@@ -23,4 +23,26 @@ inline std::size_t countResidentBytes() {
     return resident * static_cast<std::size_t>(sysconf(_SC_PAGESIZE));
 }
 
+/// Begins to watch the largest count of resident bytes anew.
+inline void resetPeakBytes() {
+    if (std::FILE* file = std::fopen("/proc/self/clear_refs", "w")) {
+        std::fputs("5", file);
+        std::fclose(file);
+    }
+}
+
+/// Returns: the most bytes of memory that have stood behind the process since the reset.
+inline std::size_t countPeakBytes() {
+    constexpr std::size_t kilobyte = 1024;
+    unsigned long peak = 0;
+    if (std::FILE* file = std::fopen("/proc/self/status", "r")) {
+        char line[256];
+        while (std::fgets(line, sizeof(line), file) &&
+               std::sscanf(line, "VmHWM: %lu", &peak) != 1) {
+        }
+        std::fclose(file);
+    }
+    return peak * kilobyte;
+}
+
 } // namespace DrawmereNS

@@ -182,7 +182,8 @@ public:
     std::int32_t jpegQuality = 0;           ///< of JPEG files that are written, 80 by default
     UnicodeString unsetText;                ///< bogus by default; not read by the library
     UnicodeString imageBaseUri;             ///< base of references to images, bogus by default
-    /// Where copied images go, "./" by default; relative to the directory of `svgOutputUri`.
+    /// Where copied images go, "./" by default; relative to the directory of `svgOutputUri`. It
+    /// ends in a slash: without one its last part becomes the beginning of the file names.
     UnicodeString imageCopyUri;
     /// True, the default: the document goes to the caller's stream. For files set it to false. A
     /// document of several pages wants `singleFile` here too: links between its pages lead to the

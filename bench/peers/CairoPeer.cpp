@@ -1,6 +1,8 @@
 #include "bench/peers/CairoPeer.h"
 
 #include <cairo-svg.h>
+#include <fstream>
+#include <iterator>
 
 namespace DrawmereNS {
 namespace {
@@ -94,6 +96,18 @@ void CairoPeer::drawText(const char* text, const float* x, float y) {
         glyphs[i].x = wide(x[i]);
     }
     cairo_show_glyphs(context, glyphs, glyphCount);
+}
+
+void CairoPeer::drawPng(const std::string& imagePath, float x, float y) {
+    std::ifstream file(imagePath, std::ios::binary);
+    auto* const bytes = new std::string(std::istreambuf_iterator<char>(file), {});
+    cairo_surface_t* const image = cairo_image_surface_create(CAIRO_FORMAT_RGB24, 1, 1);
+    cairo_surface_set_mime_data(
+        image, CAIRO_MIME_TYPE_PNG, reinterpret_cast<const unsigned char*>(bytes->data()),
+        bytes->size(), [](void* owned) { delete static_cast<std::string*>(owned); }, bytes);
+    cairo_set_source_surface(context, image, wide(x), wide(y));
+    cairo_paint(context);
+    cairo_surface_destroy(image);
 }
 
 bool CairoPeer::finish() {

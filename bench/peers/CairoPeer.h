@@ -54,6 +54,9 @@ public:
     /// Draws `text` with one x for each glyph. Shape: `x` has as many numbers as `text` glyphs.
     void drawText(const char* text, const float* x, float y);
 
+    /// Places the bytes of a PNG file, as they are, instead of pixels.
+    void drawPng(const std::string& imagePath, float x, float y);
+
     /// Ends the document. Returns: whether all went well.
     bool finish();
 
