@@ -117,11 +117,14 @@ Contest makeBase64Contest(const std::string& input, std::string& out) {
 
 /// The place of the image with this number.
 struct Place {
-    explicit Place(std::size_t i)
-        : x(static_cast<float>(i % 5) * width), y(static_cast<float>(i / 5) * height) {}
+    explicit Place(std::size_t i) {
+        const std::size_t row = i / 5;
+        x = static_cast<float>(i % 5) * width;
+        y = static_cast<float>(row) * height;
+    }
 
-    float x;
-    float y;
+    float x = 0.0F;
+    float y = 0.0F;
 };
 
 void drawImages(PlainWriter& page, const ImageFiles& files) {

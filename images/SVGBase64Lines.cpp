@@ -2,6 +2,8 @@
 
 #include "images/SVGBase64.h"
 
+#include <cstdint>
+
 #if defined(__x86_64__) && defined(__GNUC__)
 #define DRAWMERE_VECTOR_BASE64
 #include <immintrin.h>
@@ -40,17 +42,29 @@ bool isAlwaysSupported() { return true; }
 // over 51 choose a row, those below 26 the row 13, all others the row 0. A line is no whole number
 // of vectors, so the last one overlaps the one before it.
 
-#define DRAWMERE_FIELD_SHUFFLE(first)                                                              \
-    first + 1, first, first + 2, first + 1, first + 4, first + 3, first + 5, first + 4, first + 7, \
-        first + 6, first + 8, first + 7, first + 10, first + 9, first + 11, first + 10
-#define DRAWMERE_CHARACTER_SHIFTS                                                                  \
-    'a' - 26, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52,      \
-        '0' - 52, '0' - 52, '+' - 62, '/' - 63, 'A', 0, 0
+// The first sixteen are for bytes at the start of a vector, the others for bytes from the fourth
+// on.
+alignas(32) constexpr std::int8_t fieldShuffle[] = {
+    1, 0, 2, 1, 4, 3, 5, 4, 7,  6,  8,  7,  10, 9,  11, 10, //
+    5, 4, 6, 5, 8, 7, 9, 8, 11, 10, 12, 11, 14, 13, 15, 14,
+};
+
+// Twice the same row.
+alignas(32) constexpr std::int8_t characterShifts[] = {
+    'a' - 26, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, //
+    '0' - 52, '0' - 52, '0' - 52, '+' - 62, '/' - 63, 'A',      0,        0,        //
+    'a' - 26, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, '0' - 52, //
+    '0' - 52, '0' - 52, '0' - 52, '+' - 62, '/' - 63, 'A',      0,        0,
+};
 
 constexpr int upperFieldMask = 0x0fc0fc00;
 constexpr int upperFieldShift = 0x04000040; // to the right, as the high half of a product
 constexpr int lowerFieldMask = 0x003f03f0;
 constexpr int lowerFieldShift = 0x01000010;
+
+__attribute__((target("ssse3"))) inline __m128i loadVector(const void* in) {
+    return _mm_loadu_si128(static_cast<const __m128i*>(in));
+}
 
 __attribute__((target("ssse3"))) inline __m128i encodeShuffled(__m128i bytes) {
     const __m128i upper = _mm_mulhi_epu16(_mm_and_si128(bytes, _mm_set1_epi32(upperFieldMask)),
@@ -61,19 +75,15 @@ __attribute__((target("ssse3"))) inline __m128i encodeShuffled(__m128i bytes) {
     const __m128i isCapital = _mm_cmpgt_epi8(_mm_set1_epi8(26), fields);
     const __m128i rows = _mm_or_si128(_mm_subs_epu8(fields, _mm_set1_epi8(51)),
                                       _mm_and_si128(isCapital, _mm_set1_epi8(13)));
-    const __m128i shifts = _mm_shuffle_epi8(_mm_setr_epi8(DRAWMERE_CHARACTER_SHIFTS), rows);
+    const __m128i shifts = _mm_shuffle_epi8(loadVector(characterShifts), rows);
     return _mm_add_epi8(fields, shifts);
 }
 
-__attribute__((target("ssse3"))) inline __m128i loadVector(const char* in) {
-    return _mm_loadu_si128(reinterpret_cast<const __m128i*>(in));
-}
-
 __attribute__((target("ssse3"))) void encodeSsse3(const char* in, std::size_t lines, char* out) {
-    const __m128i shuffle = _mm_setr_epi8(DRAWMERE_FIELD_SHUFFLE(0));
-    const __m128i endShuffle = _mm_setr_epi8(DRAWMERE_FIELD_SHUFFLE(4));
+    const __m128i shuffle = loadVector(fieldShuffle);
+    const __m128i endShuffle = loadVector(fieldShuffle + 16);
     for (std::size_t line = 0; line < lines; ++line) {
-        for (int i = 0; i < 4; ++i) {
+        for (std::size_t i = 0; i < 4; ++i) {
             const __m128i bytes = _mm_shuffle_epi8(loadVector(in + 12 * i), shuffle);
             _mm_storeu_si128(reinterpret_cast<__m128i*>(out + 16 * i), encodeShuffled(bytes));
         }
@@ -99,13 +109,13 @@ __attribute__((target("avx2"))) inline __m256i encodeShuffled(__m256i bytes) {
     const __m256i isCapital = _mm256_cmpgt_epi8(_mm256_set1_epi8(26), fields);
     const __m256i rows = _mm256_or_si256(_mm256_subs_epu8(fields, _mm256_set1_epi8(51)),
                                          _mm256_and_si256(isCapital, _mm256_set1_epi8(13)));
-    const __m256i table = _mm256_setr_epi8(DRAWMERE_CHARACTER_SHIFTS, DRAWMERE_CHARACTER_SHIFTS);
+    const __m256i table = _mm256_load_si256(reinterpret_cast<const __m256i*>(characterShifts));
     return _mm256_add_epi8(fields, _mm256_shuffle_epi8(table, rows));
 }
 
 /// Encodes 24 bytes; the upper half is read with the four bytes before it, so nothing behind is.
 __attribute__((target("avx2"))) inline void encodeVector(const char* in, char* out) {
-    const __m256i shuffle = _mm256_setr_epi8(DRAWMERE_FIELD_SHUFFLE(0), DRAWMERE_FIELD_SHUFFLE(4));
+    const __m256i shuffle = _mm256_load_si256(reinterpret_cast<const __m256i*>(fieldShuffle));
     const __m256i bytes = _mm256_inserti128_si256(
         _mm256_castsi128_si256(_mm_loadu_si128(reinterpret_cast<const __m128i*>(in))),
         _mm_loadu_si128(reinterpret_cast<const __m128i*>(in + 8)), 1);

@@ -114,7 +114,7 @@ UnicodeString SVGGraphicManager::copyImage(TLGraphicImage* image, const MoxUri& 
 UnicodeString SVGGraphicManager::copyBytes(TLGraphicImage* image, const MoxUri& target,
                                            const UnicodeString& extension) const {
     const UnicodeString source = MoxUri::getLocalPath(image->getOrgFileName());
-    const UnicodeString path = makeCopyName(image, target, extension);
+    UnicodeString path = makeCopyName(image, target, extension);
     if (!config->isCreatedOStream(path) && source != path) {
         writeCopy(image, path);
     }
@@ -152,7 +152,7 @@ UnicodeString SVGGraphicManager::convertImage(TLGraphicImage* image, const MoxUr
     const bool isJpeg = getCnvDstType(graphic.raster) == GRAPHICTYPE_JPEG;
     const UnicodeString extension(isJpeg ? jpegExtension : pngExtension);
     if (isRequired) {
-        const UnicodeString path = makeCopyName(image, target, extension);
+        UnicodeString path = makeCopyName(image, target, extension);
         writeConverted(*graphic.raster, path, type);
         return path;
     }
