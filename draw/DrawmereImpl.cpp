@@ -33,6 +33,20 @@ std::u16string_view getDefaultColorText(bool colorFlag) {
     return viewOf(texts[colorFlag ? 1 : 0]);
 }
 
+/// What the small-device mode looks at: colours of these elements, in these attributes.
+QuilletExtention makeQuillet() {
+    constexpr SVGName::Number elements[] = {
+        SVGName::circle,  SVGName::ellipse,  SVGName::line, SVGName::path,
+        SVGName::polygon, SVGName::polyline, SVGName::rect, SVGName::text,
+    };
+    QuilletExtention quillet;
+    for (const SVGName::Number element : elements) {
+        quillet.paintableElements.insert(SVGName(element));
+    }
+    quillet.paintAttributes = {SVGName(SVGName::fill), SVGName(SVGName::stroke)};
+    return quillet;
+}
+
 /// Where a comment goes: the child of `root` that it precedes, null for the end.
 MoxElement* findCommentSuccessor(const MoxElement& root) {
     auto* first = narrow<MoxElement>(root.getFirstChild());
@@ -156,7 +170,9 @@ void DrawmereImpl::finishRootSvg() {
         SVGOptimizer::optimize(root);
     }
     if (config->svgType == SVGConfig::SVGTYPE_TINY && config->wispMode) {
-        QuilletExtention().optimizeQuillet(root);
+        makeQuillet().optimizeQuillet(root);
+        // Anchors are texts, which the passes replace: those noted stand in the tree no longer.
+        wantsWalk = true;
     }
 }
 
