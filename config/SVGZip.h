@@ -87,7 +87,6 @@ public:
     SVGZipStream& operator=(const SVGZipStream&) = delete;
     ~SVGZipStream() override;
 
-private:
     SVGZipStreamBuf buffer;
 };
 

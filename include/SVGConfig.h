@@ -153,6 +153,23 @@ public:
     /// Forgets all image names and starts to count generated ones at 0 again.
     void initImageName();
 
+    /// Returns: the limit for output files in kilobytes of 1024 bytes, the value of "maxsize" in
+    /// `wispOptions`; 0, which means none, outside `wispMode`.
+    std::int32_t getMaxFileSize() const;
+
+    /// Returns: the local path of what stands in for a file beyond the limit, the value of
+    /// "errorsvg" in `wispOptions`; empty outside `wispMode`.
+    UnicodeString getMaxFileSizeErrorSvg() const;
+
+    /// Replaces the output file `path`, a local path, by a copy of the substitute when it is larger
+    /// than the limit; nothing but the caller runs this check. `pageNo` is told in the report. The
+    /// substitute may be larger than the limit itself, and is replaced by itself then.
+    /// Queues: 17320 (text 16424) for a file that was replaced; 16935 (text 16423) when there is no
+    /// substitute that can be read, however large the file, which stays; 16926 (text 16414) when
+    /// the copy can't be written.
+    /// Ignores: a limit below 1, and a `path` that is no file.
+    void checkMaxFileSize(const UnicodeString& path, int pageNo);
+
     /// Returns: whether errors wait that the document survived.
     bool hasError() const;
 
