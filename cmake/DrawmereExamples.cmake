@@ -19,6 +19,7 @@ function(drawmere_add_example name)
     set_tests_properties(examples.${name} PROPERTIES FIXTURES_SETUP ${name} TIMEOUT 120)
     drawmere_lint_example(${name} wellformed --noout)
     drawmere_lint_example(${name} valid --noout --dtdvalidfpi "-//W3C//DTD SVG 1.1//EN")
+    drawmere_add_example_for_profiles(${name})
 endfunction()
 
 function(drawmere_lint_example name claim)
@@ -27,4 +28,28 @@ function(drawmere_lint_example name claim)
         WORKING_DIRECTORY ${CMAKE_CURRENT_BINARY_DIR}/out/${name}
     )
     set_tests_properties(examples.${name}.${claim} PROPERTIES FIXTURES_REQUIRED ${name})
+endfunction()
+
+# The same source once more, with the header in front that lets a test choose the output profile.
+function(drawmere_add_example_for_profiles name)
+    add_executable(${name}_profiles ${name}.cpp)
+    target_link_libraries(${name}_profiles PRIVATE drawmere drawmere_flags)
+    target_compile_definitions(${name}_profiles PRIVATE
+        $<TARGET_PROPERTY:${name},COMPILE_DEFINITIONS>
+    )
+    target_compile_options(${name}_profiles PRIVATE
+        "SHELL:-include ${PROJECT_SOURCE_DIR}/tests/profiles/ProfileConfig.h"
+    )
+    set_target_properties(${name}_profiles PROPERTIES
+        RUNTIME_OUTPUT_DIRECTORY ${PROJECT_BINARY_DIR}/tests/profiles
+        RUNTIME_OUTPUT_NAME ${name}
+    )
+    set_property(GLOBAL APPEND PROPERTY DRAWMERE_EXAMPLES ${name})
+endfunction()
+
+# drawmere_finish_examples() adds the test that runs every example in every profile.
+function(drawmere_finish_examples)
+    if(DRAWMERE_TESTS)
+        add_subdirectory(${PROJECT_SOURCE_DIR}/tests/profiles ${PROJECT_BINARY_DIR}/tests/profiles)
+    endif()
 endfunction()
