@@ -75,6 +75,10 @@ void SVGTinyImpl::endGradiant() {
 }
 
 void SVGTinyImpl::setStopColor(const MoxColor& color, float offset, float /*opacity*/) {
+    // Elsewhere a stop means nothing, and the lock behind it would keep out all that follows.
+    if (treeManager->unlocked) {
+        return;
+    }
     if (noStopYet || offset >= highStopOffset) {
         highStopColor = color;
         highStopOffset = offset;
@@ -84,7 +88,6 @@ void SVGTinyImpl::setStopColor(const MoxColor& color, float offset, float /*opac
         lowStopOffset = offset;
     }
     noStopYet = false;
-    treeManager->setupStopLock();
 }
 
 UnicodeString SVGTinyImpl::startPattern(const MoxRectT<MoxLength>& /*area*/,

@@ -41,6 +41,7 @@ public:
     /// Notes the colour half way between the two ends as that of the gradient.
     void endGradiant() override; // sic
     /// Keeps the colours of the lowest and of the highest offset; the later of two at one offset.
+    /// Ignores: a call outside a gradient.
     void setStopColor(const MoxColor& color, float offset, float opacity) override;
 
     /// Drops what is drawn until `endPattern`. Returns: an empty id.

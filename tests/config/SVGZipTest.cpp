@@ -236,6 +236,16 @@ TEST(SVGZip, WriteErrorShowsInTheStreamWhenItIsFlushed) {
     EXPECT_TRUE(target.fail());
 }
 
+TEST(SVGZip, FullDiskShowsInTheStreamOfAFileWhenItIsFlushed) {
+    SVGZipStream stream(u"/dev/full");
+    EXPECT_TRUE(stream.good());
+    stream << makeRandomBytes(3 * bufferSize) << std::flush;
+    EXPECT_TRUE(stream.bad());
+    stream.clear();
+    stream << makeRandomBytes(3 * bufferSize) << std::flush; // which ends all the same
+    EXPECT_TRUE(stream.bad());
+}
+
 TEST(SVGZip, TargetThatThrowsDoesNotBreakTheDestruction) {
     FullBuf full(100);
     std::ostream target(&full);

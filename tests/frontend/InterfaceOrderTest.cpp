@@ -2,6 +2,8 @@
 // were compiled before rely on it.
 #include "Drawmere.h"
 #include "draw/DrawmereImpl.h"
+#include "draw/SVGTinyImpl.h"
+#include "draw/SVGWispImpl.h"
 #include "tree/SVGTreeManager.h"
 
 #include <gtest/gtest.h>
@@ -84,6 +86,14 @@ TEST(InterfaceOrder, VirtualOperationsOfTheImplementationKeepTheirSlots) {
     EXPECT_EQ(describe(slots, destructorSlots), "");
 }
 
+TEST(InterfaceOrder, TextOfTinyFollowsTheVirtualOperationsOfItsBases) {
+    using T = SVGTinyImpl;
+    EXPECT_EQ(
+        slotOf(static_cast<void (T::*)(const UnicodeString&, const MoxLength&, const MoxLength&,
+                                       PAINTMODE, TLStringWithGlyphInfo*, bool)>(&T::drawText)),
+        slotOf(&DrawmereImpl::addElement) + 1);
+}
+
 TEST(InterfaceOrder, VirtualOperationsOfTheHandlerKeepTheirSlots) {
     using H = DrawmereErrHandler;
     EXPECT_EQ(slotOf(static_cast<void (H::*)(const MoxError&)>(&H::handleError)), destructorSlots);
@@ -155,6 +165,18 @@ TEST(InterfaceOrder, MembersOfTheImplementationKeepTheirOrder) {
                             &i.refIdManager, &i.clipPathId, &i.inClipDef, &i.lastPathPaintMode,
                             &i.graphicManager, &i.fontManager, &i.config}),
               -1);
+}
+
+template <typename Impl> int findDisorderInGradient() {
+    SVGConfig config;
+    const Impl i(&config);
+    return findDisorder({&i, &i.config, &i.gradientId, &i.lowStopColor, &i.highStopColor,
+                         &i.noStopYet, &i.highStopOffset, &i.lowStopOffset});
+}
+
+TEST(InterfaceOrder, MembersOfTinyAndWispKeepTheirOrder) {
+    EXPECT_EQ(findDisorderInGradient<SVGTinyImpl>(), -1);
+    EXPECT_EQ(findDisorderInGradient<SVGWispImpl>(), -1);
 }
 
 TEST(InterfaceOrder, MembersOfTheTreeManagerKeepTheirOrder) {
