@@ -31,3 +31,7 @@ using icu::UnicodeString;
 namespace TalFont {
 using icu::UnicodeString;
 }
+
+namespace MoxFontService_NS {
+using icu::UnicodeString;
+}

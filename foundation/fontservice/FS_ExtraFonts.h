@@ -11,8 +11,6 @@
 
 namespace MoxFontService_NS {
 
-using icu::UnicodeString;
-
 class FS_ExtraFontList;
 
 /// The slant of a further font.

@@ -1,14 +1,35 @@
 #include "foundation/fontservice/FS_FontInfo.h"
 
+#include "foundation/fontservice/FS_ExtraFontList.h"
 #include "foundation/fontservice/FS_FoundFace.h"
+#include "foundation/fontservice/FS_SystemFonts.h"
+
+#include <cstdlib>
+#include <limits>
+#include <optional>
+#include <utility>
 
 namespace MoxFontService_NS {
 
 namespace {
 
 constexpr int neutralUnitsPerEm = 1000;
-constexpr int neutralWeight = 400;
-constexpr int neutralWidthClass = 5;
+
+// How many characters a handle remembers the glyphs of, and the bits of that number.
+constexpr std::uint32_t knownGlyphBits = 11;
+constexpr std::uint32_t knownGlyphCount = 1U << knownGlyphBits;
+
+// Spreads keys that follow each other, and those of distant scripts.
+std::uint32_t placeOf(std::uint32_t key) {
+    constexpr std::uint32_t spread = 0x9E3779B1; // 2^32 over the golden ratio
+    constexpr std::uint32_t wordBits = 32;
+    return key * spread >> (wordBits - knownGlyphBits);
+}
+
+int saturatedAbs(int number) {
+    return number == std::numeric_limits<int>::min() ? std::numeric_limits<int>::max()
+                                                     : std::abs(number);
+}
 
 } // namespace
 
@@ -22,41 +43,90 @@ FS_FontInfo::~FS_FontInfo() = default;
 
 bool FS_FontInfo::isCreatedFont() const { return found != nullptr; }
 
-bool FS_FontInfo::createFont(const UnicodeString& /*name*/, int /*weight*/, bool /*italic*/,
-                             int /*widthClass*/, FS_ExtraFonts* /*extra*/, bool /*reserved*/) {
-    return false;
+bool FS_FontInfo::createFont(const UnicodeString& name, int weight, bool italic, int widthClass,
+                             FS_ExtraFonts* extra, bool /*reserved*/) {
+    const FS_FaceStyle wanted = makeStyle(weight, italic, widthClass);
+    std::optional<FS_FoundName> place;
+    if (extra) {
+        place = extra->fonts->find(name, wanted);
+    }
+    if (!place) {
+        place = FS_SystemFonts::shared().find(name, wanted);
+    }
+    std::shared_ptr<const FS_FoundFace> opened = place ? FS_FoundFace::open(*place) : nullptr;
+    if (!opened) {
+        return false;
+    }
+    found = std::move(opened);
+    knownGlyphs.clear();
+    return true;
 }
 
-UnicodeString FS_FontInfo::getFamilyName(MoxLang::LanguageID /*language*/) const { return {}; }
+UnicodeString FS_FontInfo::getFamilyName(MoxLang::LanguageID /*language*/) const {
+    return found ? found->familyName : UnicodeString();
+}
 
 void FS_FontInfo::getFontStyle(int* weight, bool* italic, int* widthClass) const {
+    const FS_FaceStyle style = found ? found->style : FS_FaceStyle();
     if (weight) {
-        *weight = neutralWeight;
+        *weight = style.weight;
     }
     if (italic) {
-        *italic = false;
+        *italic = style.italic;
     }
     if (widthClass) {
-        *widthClass = neutralWidthClass;
+        *widthClass = style.widthClass;
     }
 }
 
-int FS_FontInfo::getUnitsPerEm() const { return neutralUnitsPerEm; }
-
-unsigned short FS_FontInfo::getGlyphID(int /*codePoint*/, bool /*vertical*/) const {
-    return noGlyph;
+int FS_FontInfo::getUnitsPerEm() const {
+    return found ? found->face->unitsPerEm : neutralUnitsPerEm;
 }
 
-bool FS_FontInfo::getGlyphDrawInfo(unsigned short /*glyphId*/, FS_GlyphDrawInfo& info,
+unsigned short FS_FontInfo::getGlyphID(int codePoint, bool vertical) const {
+    if (!found || codePoint < 0) {
+        return noGlyph;
+    }
+    if (knownGlyphs.empty()) {
+        knownGlyphs.resize(knownGlyphCount);
+    }
+    // Never 0, which marks a place that is free.
+    const std::uint32_t key = 2 * static_cast<std::uint32_t>(codePoint) + (vertical ? 2 : 1);
+    KnownGlyph& known = knownGlyphs[placeOf(key)];
+    if (known.key != key) {
+        known = {key, found->face->findGlyph(codePoint, vertical)};
+    }
+    return known.glyphId;
+}
+
+bool FS_FontInfo::getGlyphDrawInfo(unsigned short glyphId, FS_GlyphDrawInfo& info,
                                    bool /*reserved*/) const {
+    if (found) {
+        return found->face->readGlyph(glyphId, info);
+    }
     info = FS_GlyphDrawInfo();
     return false;
 }
 
-float FS_FontInfo::getDefaultCharWidth(int /*reserved*/) const { return 0.0F; }
+float FS_FontInfo::getDefaultCharWidth(int /*reserved*/) const {
+    FS_GlyphDrawInfo info;
+    if (getGlyphDrawInfo(0, info, /*reserved=*/false)) {
+        return static_cast<float>(info.horizontalAdvance);
+    }
+    FS_NewTextMetricEx metrics;
+    getOutlineTextMetrics(metrics, 0);
+    return static_cast<float>(metrics.averageCharWidth);
+}
 
-void FS_FontInfo::getOutlineTextMetrics(FS_NewTextMetricEx& metrics, int /*size*/) const {
+void FS_FontInfo::getOutlineTextMetrics(FS_NewTextMetricEx& metrics, int size) const {
     metrics = FS_NewTextMetricEx();
+    const int unitsWanted = size == 0 ? getUnitsPerEm() : saturatedAbs(size);
+    metrics.unitsPerEm = unitsWanted;
+    if (found) {
+        found->face->readMetrics(metrics, unitsWanted);
+        metrics.weight = found->style.weight;
+        metrics.italic = found->style.italic;
+    }
 }
 
 } // namespace MoxFontService_NS

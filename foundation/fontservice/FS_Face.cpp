@@ -1,0 +1,216 @@
+#include "foundation/fontservice/FS_Face.h"
+
+#include "foundation/fontservice/FS_FaceNames.h"
+#include "foundation/fontservice/FS_FontLibrary.h"
+#include "foundation/fontservice/FS_OutlineReader.h"
+#include "foundation/fontservice/FS_VariationAxes.h"
+
+#include <hb-ft.h>
+#include <hb-ot.h>
+
+#include <algorithm>
+#include <utility>
+
+#include FT_TRUETYPE_TABLES_H
+
+namespace MoxFontService_NS {
+
+namespace {
+
+constexpr int boldWeight = 700;
+constexpr int lastCodePoint = 0x10FFFF;
+
+const TT_OS2* findOS2(FT_Face face) {
+    constexpr FT_UShort absent = 0xFFFF;
+    const auto* table = static_cast<const TT_OS2*>(FT_Get_Sfnt_Table(face, FT_SFNT_OS2));
+    return table && table->version != absent ? table : nullptr;
+}
+
+// Old fonts count weights from 1 to 9.
+int readWeight(const TT_OS2& table) {
+    constexpr int hundred = 100;
+    return table.usWeightClass < 10 ? hundred * table.usWeightClass : table.usWeightClass;
+}
+
+bool isItalic(const TT_OS2& table) {
+    constexpr unsigned italicBit = 1U << 0U;
+    constexpr unsigned obliqueBit = 1U << 9U;
+    return (table.fsSelection & (italicBit | obliqueBit)) != 0;
+}
+
+// What all of the face's characters have in common when no Unicode is known for them.
+constexpr bool isAscii(int codePoint) { return codePoint >= 0 && codePoint < 0x80; }
+
+struct MetricField {
+    int FS_NewTextMetricEx::*target;
+    long value;
+};
+
+} // namespace
+
+std::shared_ptr<FS_Face> FS_Face::open(const FS_FaceRequest& request) {
+    const std::shared_ptr<FS_FontLibrary> library = FS_FontLibrary::shared();
+    FT_Face opened = library ? library->open(request.source, request.faceIndex) : nullptr;
+    if (!opened) {
+        return nullptr;
+    }
+    const std::shared_ptr<FS_Face> made(new FS_Face(library, request.source, opened));
+    return made->setUp(request) ? made : nullptr;
+}
+
+FS_Face::FS_Face(std::shared_ptr<FS_FontLibrary> fontLibrary, FS_FontSource fontSource,
+                 FT_Face openedFace)
+    : library(std::move(fontLibrary)), source(std::move(fontSource)), face(openedFace),
+      shapes(hb_ft_face_create(openedFace, nullptr)), composites(openedFace) {}
+
+FS_Face::~FS_Face() {
+    verticalForms.reset();
+    hb_font_destroy(symbols);
+    hb_face_destroy(shapes);
+    library->close(face);
+}
+
+bool FS_Face::setUp(const FS_FaceRequest& request) {
+    if (FT_IS_SCALABLE(face) && face->units_per_EM > 0) {
+        unitsPerEm = face->units_per_EM;
+    }
+    chooseCharMap();
+    readFontStyle();
+    FS_VariationAxes axes(face);
+    const int designedWidth = style.widthClass;
+    if (request.axes && !axes.apply(*request.axes)) {
+        return false;
+    }
+    axes.readStyle(style);
+    range = axes.readRange(style);
+    isVariable = axes.areThere();
+    familyName = readFamilyName(face);
+    if (style.widthClass != designedWidth) {
+        familyName += u' ';
+        familyName += widthWordOf(style.widthClass);
+    }
+    return true;
+}
+
+void FS_Face::readFontStyle() {
+    const TT_OS2* table = findOS2(face);
+    const bool italic = (face->style_flags & FT_STYLE_FLAG_ITALIC) != 0;
+    if (table) {
+        style = makeStyle(readWeight(*table), italic || isItalic(*table), table->usWidthClass);
+        return;
+    }
+    style.italic = italic;
+    if ((face->style_flags & FT_STYLE_FLAG_BOLD) != 0) {
+        style.weight = boldWeight;
+    }
+}
+
+// Where there is no Unicode, a charmap of symbols is read as shapers do, any other for ASCII.
+void FS_Face::chooseCharMap() {
+    if (face->charmap && face->charmap->encoding == FT_ENCODING_UNICODE) {
+        return;
+    }
+    if (FT_Select_Charmap(face, FT_ENCODING_MS_SYMBOL) == 0) {
+        symbols = hb_font_create(shapes);
+        hb_ot_font_set_funcs(symbols);
+    } else if (face->num_charmaps > 0) {
+        FT_Set_Charmap(face, face->charmaps[0]);
+    }
+}
+
+std::uint16_t FS_Face::findGlyph(int codePoint, bool vertical) {
+    if (codePoint < 0 || codePoint > lastCodePoint) {
+        return noGlyph;
+    }
+    const std::lock_guard lock(inUse);
+    unsigned glyph = lookUp(codePoint);
+    if (glyph == 0 || glyph >= noGlyph) {
+        return noGlyph;
+    }
+    if (vertical) {
+        if (!verticalForms) {
+            verticalForms.emplace(shapes);
+        }
+        glyph = verticalForms->find(glyph);
+    }
+    return static_cast<std::uint16_t>(std::min<unsigned>(glyph, noGlyph));
+}
+
+unsigned FS_Face::lookUp(int codePoint) {
+    if (symbols) {
+        return lookUpSymbol(codePoint);
+    }
+    const bool unicode = face->charmap && face->charmap->encoding == FT_ENCODING_UNICODE;
+    return unicode || isAscii(codePoint) ? FT_Get_Char_Index(face, codePoint) : 0;
+}
+
+// Symbols stand in the private range, for the characters from U+0020 to U+00FF.
+unsigned FS_Face::lookUpSymbol(int codePoint) {
+    constexpr int symbolBase = 0xF000;
+    constexpr int symbolCount = 0x100;
+    if (const unsigned glyph = FT_Get_Char_Index(face, codePoint)) {
+        return glyph;
+    }
+    if (codePoint < symbolCount) {
+        return FT_Get_Char_Index(face, symbolBase + codePoint);
+    }
+    hb_codepoint_t glyph = 0; // Arabic fonts of old have their letters there too
+    return hb_font_get_nominal_glyph(symbols, codePoint, &glyph) ? glyph : 0;
+}
+
+bool FS_Face::readGlyph(unsigned glyphId, FS_GlyphDrawInfo& info) {
+    const std::lock_guard lock(inUse);
+    if (loadOutline(glyphId, info)) {
+        return true;
+    }
+    info.horizontalAdvance = 0;
+    info.verticalAdvance = 0;
+    info.polygons.clear();
+    return false;
+}
+
+bool FS_Face::loadOutline(unsigned glyphId, FS_GlyphDrawInfo& info) {
+    if (!FT_IS_SCALABLE(face) || glyphId >= static_cast<unsigned long>(face->num_glyphs) ||
+        !composites.isBounded(glyphId) || FT_Load_Glyph(face, glyphId, FT_LOAD_NO_SCALE) != 0) {
+        return false;
+    }
+    const FT_GlyphSlot slot = face->glyph;
+    if (slot->format != FT_GLYPH_FORMAT_OUTLINE) {
+        return false;
+    }
+    info.horizontalAdvance = static_cast<int>(slot->metrics.horiAdvance);
+    info.verticalAdvance =
+        FT_HAS_VERTICAL(face) ? static_cast<int>(slot->metrics.vertAdvance) : unitsPerEm;
+    return FS_OutlineReader::read(slot->outline, info.polygons);
+}
+
+void FS_Face::readMetrics(FS_NewTextMetricEx& metrics, int unitsWanted) {
+    const std::lock_guard lock(inUse);
+    const TT_OS2* table = findOS2(face);
+    const bool hasHeights = table && table->version >= 2;
+    const MetricField fields[] = {
+        {&FS_NewTextMetricEx::ascender, face->ascender},
+        {&FS_NewTextMetricEx::descender, face->descender},
+        {&FS_NewTextMetricEx::lineGap, face->height - face->ascender + face->descender},
+        {&FS_NewTextMetricEx::capHeight, hasHeights ? table->sCapHeight : 0},
+        {&FS_NewTextMetricEx::xHeight, hasHeights ? table->sxHeight : 0},
+        {&FS_NewTextMetricEx::underlinePosition, face->underline_position},
+        {&FS_NewTextMetricEx::underlineThickness, face->underline_thickness},
+        {&FS_NewTextMetricEx::averageCharWidth, table ? table->xAvgCharWidth : 0},
+        {&FS_NewTextMetricEx::maxCharWidth, face->max_advance_width},
+    };
+    for (const MetricField& field : fields) {
+        metrics.*field.target = static_cast<int>(FT_MulDiv(field.value, unitsWanted, unitsPerEm));
+    }
+    metrics.unitsPerEm = unitsWanted;
+    metrics.weight = style.weight;
+    metrics.italic = style.italic;
+    metrics.fixedPitch = FT_IS_FIXED_WIDTH(face) != 0;
+}
+
+std::vector<UnicodeString> FS_Face::readAllNames() {
+    const std::lock_guard lock(inUse);
+    return readNames(face);
+}
+
+} // namespace MoxFontService_NS

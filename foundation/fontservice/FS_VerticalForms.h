@@ -1,0 +1,28 @@
+/// The glyphs that a font substitutes in vertical text.
+#pragma once
+
+#include <hb.h>
+
+#include <vector>
+
+namespace MoxFontService_NS {
+
+/// The substitutions of the OpenType features vrt2 and vert, of all scripts and languages.
+class FS_VerticalForms {
+public:
+    /// Borrows: `fontFace`, for its life.
+    explicit FS_VerticalForms(hb_face_t* fontFace);
+    FS_VerticalForms(const FS_VerticalForms&) = delete;
+    FS_VerticalForms& operator=(const FS_VerticalForms&) = delete;
+    ~FS_VerticalForms();
+
+    /// Returns: the vertical form of the glyph, else the glyph itself.
+    unsigned find(unsigned glyphId) const;
+
+private:
+    hb_face_t* face;  // borrowed
+    hb_set_t* glyphs; // owned, the scratch of `find`
+    std::vector<unsigned> lookups;
+};
+
+} // namespace MoxFontService_NS
