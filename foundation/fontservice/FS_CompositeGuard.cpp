@@ -27,6 +27,8 @@ std::uint32_t readLong(const unsigned char* bytes) {
     return readWord(bytes) << 16U | readWord(bytes + 2);
 }
 
+std::uint32_t readHalved(const unsigned char* bytes) { return 2 * readWord(bytes); }
+
 // The bytes of a part behind its flags and its glyph.
 std::uint32_t sizeOfRest(unsigned flags) {
     const std::uint32_t offsets = (flags & PARTFLAG_WORDS) != 0 ? 4 : 2;
@@ -81,14 +83,17 @@ bool FS_CompositeGuard::isComposite(std::uint32_t place) const {
     return readTable(TTAG_glyf, place, count, sizeof count) && (readWord(count) & signBit) != 0;
 }
 
+// A glyph that ends where it begins is empty, whatever stands there. The last one may lack an end.
 bool FS_CompositeGuard::findGlyph(unsigned glyphId, std::uint32_t& place) const {
-    unsigned char entry[4] = {};
+    unsigned char entries[8] = {};
     const std::uint32_t size = longPlaces ? 4 : 2;
-    if (!readTable(TTAG_loca, glyphId * size, entry, size)) {
+    const auto read = longPlaces ? readLong : readHalved;
+    const bool hasEnd = readTable(TTAG_loca, glyphId * size, entries, 2 * size);
+    if (!hasEnd && !readTable(TTAG_loca, glyphId * size, entries, size)) {
         return false;
     }
-    place = longPlaces ? readLong(entry) : 2 * readWord(entry);
-    return true;
+    place = read(entries);
+    return !hasEnd || place != read(entries + size);
 }
 
 // Reads on behind the end of a table that is too short, as FreeType does for loca.

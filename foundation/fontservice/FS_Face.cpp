@@ -9,6 +9,7 @@
 #include <hb-ot.h>
 
 #include <algorithm>
+#include <span>
 #include <utility>
 
 #include FT_TRUETYPE_TABLES_H
@@ -18,7 +19,6 @@ namespace MoxFontService_NS {
 namespace {
 
 constexpr int boldWeight = 700;
-constexpr int lastCodePoint = 0x10FFFF;
 
 const TT_OS2* findOS2(FT_Face face) {
     constexpr FT_UShort absent = 0xFFFF;
@@ -38,8 +38,8 @@ bool isItalic(const TT_OS2& table) {
     return (table.fsSelection & (italicBit | obliqueBit)) != 0;
 }
 
-// What all of the face's characters have in common when no Unicode is known for them.
-constexpr bool isAscii(int codePoint) { return codePoint >= 0 && codePoint < 0x80; }
+// The characters that all encodings of one byte have in common.
+constexpr bool isAscii(int codePoint) { return codePoint < 0x80; }
 
 struct MetricField {
     int FS_NewTextMetricEx::*target;
@@ -105,23 +105,21 @@ void FS_Face::readFontStyle() {
     }
 }
 
-// Where there is no Unicode, a charmap of symbols is read as shapers do, any other for ASCII.
+// Symbols are looked up as shapers do; where there is no Unicode either, any charmap serves for
+// ASCII.
 void FS_Face::chooseCharMap() {
-    if (face->charmap && face->charmap->encoding == FT_ENCODING_UNICODE) {
-        return;
-    }
-    if (FT_Select_Charmap(face, FT_ENCODING_MS_SYMBOL) == 0) {
+    const std::span<const FT_CharMap> maps(face->charmaps, face->num_charmaps);
+    const auto isSymbols = [](FT_CharMap map) { return map->encoding == FT_ENCODING_MS_SYMBOL; };
+    if (std::ranges::any_of(maps, isSymbols)) {
         symbols = hb_font_create(shapes);
         hb_ot_font_set_funcs(symbols);
-    } else if (face->num_charmaps > 0) {
-        FT_Set_Charmap(face, face->charmaps[0]);
+    }
+    if (!face->charmap && !maps.empty()) {
+        FT_Set_Charmap(face, maps.front());
     }
 }
 
 std::uint16_t FS_Face::findGlyph(int codePoint, bool vertical) {
-    if (codePoint < 0 || codePoint > lastCodePoint) {
-        return noGlyph;
-    }
     const std::lock_guard lock(inUse);
     unsigned glyph = lookUp(codePoint);
     if (glyph == 0 || glyph >= noGlyph) {
@@ -136,26 +134,17 @@ std::uint16_t FS_Face::findGlyph(int codePoint, bool vertical) {
     return static_cast<std::uint16_t>(std::min<unsigned>(glyph, noGlyph));
 }
 
+// Symbols stand in the private range, on behalf of the characters from U+0020 to U+00FF, and in
+// Arabic fonts of old on behalf of Arabic letters.
 unsigned FS_Face::lookUp(int codePoint) {
-    if (symbols) {
-        return lookUpSymbol(codePoint);
-    }
     const bool unicode = face->charmap && face->charmap->encoding == FT_ENCODING_UNICODE;
-    return unicode || isAscii(codePoint) ? FT_Get_Char_Index(face, codePoint) : 0;
-}
-
-// Symbols stand in the private range, for the characters from U+0020 to U+00FF.
-unsigned FS_Face::lookUpSymbol(int codePoint) {
-    constexpr int symbolBase = 0xF000;
-    constexpr int symbolCount = 0x100;
-    if (const unsigned glyph = FT_Get_Char_Index(face, codePoint)) {
-        return glyph;
+    if (unicode || (!symbols && isAscii(codePoint))) {
+        if (const unsigned glyph = FT_Get_Char_Index(face, codePoint)) {
+            return glyph;
+        }
     }
-    if (codePoint < symbolCount) {
-        return FT_Get_Char_Index(face, symbolBase + codePoint);
-    }
-    hb_codepoint_t glyph = 0; // Arabic fonts of old have their letters there too
-    return hb_font_get_nominal_glyph(symbols, codePoint, &glyph) ? glyph : 0;
+    hb_codepoint_t glyph = 0;
+    return symbols && hb_font_get_nominal_glyph(symbols, codePoint, &glyph) ? glyph : 0;
 }
 
 bool FS_Face::readGlyph(unsigned glyphId, FS_GlyphDrawInfo& info) {

@@ -35,7 +35,8 @@ public:
     FS_Face& operator=(const FS_Face&) = delete;
     ~FS_Face();
 
-    /// Returns: the glyph of a character, or its form in vertical text; `noGlyph` for none.
+    /// Returns: the glyph of a character of Unicode, or its form in vertical text; `noGlyph` for
+    /// none.
     std::uint16_t findGlyph(int codePoint, bool vertical);
 
     /// Fills `info` with a glyph. Returns: false, with `info` emptied, when it can't be read.
@@ -61,7 +62,6 @@ private:
     void readFontStyle();
     void chooseCharMap();
     unsigned lookUp(int codePoint);
-    unsigned lookUpSymbol(int codePoint);
     bool loadOutline(unsigned glyphId, FS_GlyphDrawInfo& info);
 
     std::shared_ptr<FS_FontLibrary> library;
@@ -69,7 +69,7 @@ private:
     std::mutex inUse;             // of all below
     FT_Face face;                 // owned
     hb_face_t* shapes;            // owned, reads tables through `face`
-    hb_font_t* symbols = nullptr; // owned, made for fonts that encode symbols alone
+    hb_font_t* symbols = nullptr; // owned; null for fonts without a charmap of symbols
     FS_CompositeGuard composites;
     std::optional<FS_VerticalForms> verticalForms; // made when first asked for
 };

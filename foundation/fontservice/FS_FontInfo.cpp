@@ -14,6 +14,7 @@ namespace MoxFontService_NS {
 namespace {
 
 constexpr int neutralUnitsPerEm = 1000;
+constexpr int lastCodePoint = 0x10FFFF;
 
 // How many characters a handle remembers the glyphs of, and the bits of that number.
 constexpr std::uint32_t knownGlyphBits = 11;
@@ -84,7 +85,7 @@ int FS_FontInfo::getUnitsPerEm() const {
 }
 
 unsigned short FS_FontInfo::getGlyphID(int codePoint, bool vertical) const {
-    if (!found || codePoint < 0) {
+    if (!found || codePoint < 0 || codePoint > lastCodePoint) {
         return noGlyph;
     }
     if (knownGlyphs.empty()) {
