@@ -34,14 +34,11 @@ UnicodeString makeErrorMessage(const FONTATTRIBUTE& font) {
 /// Returns: the part of `text` that begins at `offset`, as much of it as there is.
 std::u16string_view cut(std::u16string_view text, std::int64_t offset, std::int64_t count) {
     const auto size = static_cast<std::int64_t>(text.size());
+    if (offset >= 0 && count > 0 && offset + count <= size) {
+        return {text.data() + offset, static_cast<std::size_t>(count)};
+    }
     const std::int64_t begin = std::clamp<std::int64_t>(offset, 0, size);
     return text.substr(begin, std::clamp<std::int64_t>(count, 0, size - begin));
-}
-
-/// A mark for a character in one direction of text.
-std::uint32_t makeMark(std::int32_t codePoint, bool vertical) {
-    constexpr std::uint32_t verticalMark = 1U << 21; // above all code points
-    return static_cast<std::uint32_t>(codePoint) | (vertical ? verticalMark : 0);
 }
 
 } // namespace
@@ -63,7 +60,7 @@ bool SVGEmbFont::loadFont(FS_ExtraFonts* extraFonts) {
                                              getWidthClass(fontAttribute.fontStretch), extraFonts,
                                              /*reserved=*/true);
     if (created) {
-        knownCharacters.clear(); // what no face had the new one may have
+        forgetCharacters(); // what no face had the new one may have
     } else {
         errorMessage.append(makeErrorMessage(fontAttribute));
     }
@@ -84,21 +81,30 @@ bool SVGEmbFont::isSameFont(SVGEmbFont& other) {
     return weight == otherWeight && italic == otherItalic;
 }
 
+void SVGEmbFont::forgetCharacters() {
+    horizontalCharacters.clear();
+    verticalCharacters.clear();
+    notedTexts = countTexts();
+}
+
 void SVGEmbFont::embedText(const UnicodeString& text, bool vertical) {
     if (notedTexts != countTexts()) {
-        knownCharacters.clear();
-        notedTexts = countTexts();
+        forgetCharacters();
     }
+    SVGCodePointSet& known = vertical ? verticalCharacters : horizontalCharacters;
     const std::u16string_view units = viewOf(text);
-    const auto size = static_cast<std::int32_t>(units.size());
-    std::int32_t end = 0;
-    while (end < size) {
-        const std::int32_t begin = end;
+    std::size_t end = known.skipKnown(units, 0);
+    while (end < units.size()) {
+        const std::size_t begin = end;
         std::int32_t codePoint = 0;
-        U16_NEXT(units.data(), end, size, codePoint);
-        if (knownCharacters.insert(makeMark(codePoint, vertical))) {
+        U16_NEXT(units.data(), end, units.size(), codePoint);
+        if (!known.contains(static_cast<std::uint32_t>(codePoint))) {
             embedCodePoint(codePoint, units.substr(begin, end - begin), vertical);
         }
+        if (!U_IS_SURROGATE(codePoint)) { // half of a pair must not hide the whole
+            known.insert(static_cast<std::uint32_t>(codePoint));
+        }
+        end = known.skipKnown(units, end);
     }
 }
 
@@ -134,15 +140,17 @@ void SVGEmbFont::embedGlyphId(const UnicodeString& text, const TLStringWithGlyph
 
 void SVGEmbFont::embedClusters(std::u16string_view text, const TLStringWithGlyphInfo& glyphs,
                                bool vertical) {
+    const SVGGlyphIndex& index = followMap(vertical);
     SVGGlyphMap::value_type* added = nullptr;
     std::int64_t offset = 0;
     for (const TLGlyphEntry& entry : glyphs.entries) {
         if (entry.charCount != 0) {
-            added = addUnknown(cut(text, offset, entry.charCount), vertical);
+            const std::u16string_view cluster = cut(text, offset, entry.charCount);
+            offset += entry.charCount;
+            added = index.knows(cluster) ? nullptr : add(cluster, vertical);
             if (added) {
                 added->second.push_back(entry.glyphId);
             }
-            offset += entry.charCount;
         } else if (added && entry.glyphId != TLGlyphEntry::noGlyph) {
             added->second.push_back(entry.glyphId);
         }
@@ -151,7 +159,8 @@ void SVGEmbFont::embedClusters(std::u16string_view text, const TLStringWithGlyph
 
 void SVGEmbFont::embedRun(std::u16string_view text, const TLStringWithGlyphInfo& glyphs,
                           bool vertical) {
-    SVGGlyphMap::value_type* added = addUnknown(text, vertical);
+    SVGGlyphMap::value_type* added =
+        followMap(vertical).knows(text) ? nullptr : add(text, vertical);
     if (!added) {
         return;
     }
@@ -162,10 +171,10 @@ void SVGEmbFont::embedRun(std::u16string_view text, const TLStringWithGlyphInfo&
     }
 }
 
-SVGGlyphMap::value_type* SVGEmbFont::addUnknown(std::u16string_view text, bool vertical) {
-    const bool known = vertical ? verticalIndex.knows(verticalGlyphs, text)
-                                : horizontalIndex.knows(horizontalGlyphs, text);
-    return known ? nullptr : add(text, vertical);
+const SVGGlyphIndex& SVGEmbFont::followMap(bool vertical) {
+    SVGGlyphIndex& index = vertical ? verticalIndex : horizontalIndex;
+    index.follow(vertical ? verticalGlyphs : horizontalGlyphs);
+    return index;
 }
 
 SVGGlyphMap::value_type* SVGEmbFont::add(std::u16string_view text, bool vertical) {

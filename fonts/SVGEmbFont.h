@@ -94,14 +94,15 @@ public:
     std::map<UnicodeString, bool> reservedFlags; // stays empty
 
 private:
+    void forgetCharacters();
     void embedCodePoint(std::int32_t codePoint, std::u16string_view text, bool vertical);
     void embedClusters(std::u16string_view text, const TLStringWithGlyphInfo& glyphs,
                        bool vertical);
     void embedRun(std::u16string_view text, const TLStringWithGlyphInfo& glyphs, bool vertical);
     /// Returns: the new entry for `text`, which has no glyphs yet; null when there was one before.
     SVGGlyphMap::value_type* add(std::u16string_view text, bool vertical);
-    /// The same for texts that are hardly ever new.
-    SVGGlyphMap::value_type* addUnknown(std::u16string_view text, bool vertical);
+    /// Returns: the index of a map, which knows what is in it.
+    const SVGGlyphIndex& followMap(bool vertical);
 
     std::size_t countTexts() const { return horizontalGlyphs.size() + verticalGlyphs.size(); }
 
@@ -110,7 +111,9 @@ private:
     bool hasVerticalForm(const UnicodeString& text) const;
 
     // What is asked before the maps, which alone say what there is.
-    SVGCodePointSet knownCharacters; // those that embedText need not look at again
+    // The characters that embedText need not look at again.
+    SVGCodePointSet horizontalCharacters;
+    SVGCodePointSet verticalCharacters;
     SVGGlyphIndex horizontalIndex;
     SVGGlyphIndex verticalIndex;
     std::size_t notedTexts = 0; // as many as there were when this class looked last

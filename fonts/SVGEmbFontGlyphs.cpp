@@ -96,15 +96,18 @@ void SVGEmbFont::addMissingGlyph(MoxElement* font, SVGTreeManager* tree) {
 
 bool SVGEmbFont::getGlyphDrawInfos(const std::vector<std::uint16_t>& glyphIds,
                                    std::vector<FS_GlyphDrawInfo>& infos, bool flag) const {
-    infos.clear();
+    std::size_t count = 0; // what stands in `infos` is filled anew, which spares its allocations
     for (const std::uint16_t glyphId : glyphIds) {
-        FS_GlyphDrawInfo info;
-        if (!fontInfo.getGlyphDrawInfo(glyphId, info, flag)) {
-            return false;
+        if (count == infos.size()) {
+            infos.emplace_back();
         }
-        infos.push_back(std::move(info));
+        if (!fontInfo.getGlyphDrawInfo(glyphId, infos[count], flag)) {
+            break;
+        }
+        ++count;
     }
-    return true;
+    infos.resize(count);
+    return count == glyphIds.size();
 }
 
 MoxPtr<SVGElement> SVGEmbFont::convGlyph(const FS_GlyphDrawInfo& info, const UnicodeString& text,

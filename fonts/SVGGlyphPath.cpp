@@ -1,8 +1,10 @@
 #include "fonts/SVGGlyphPath.h"
 
+#include "foundation/common/MoxDigits.h"
 #include "foundation/common/MoxNumberText.h"
 
 #include <algorithm>
+#include <cstdlib>
 #include <iterator>
 
 namespace DrawmereNS {
@@ -13,7 +15,6 @@ using MoxFontService_NS::FS_GlyphDrawInfo;
 using MoxFontService_NS::FS_GlyphPolygon;
 
 constexpr std::size_t maxPointText = 2 * maxRealText + 1;
-constexpr std::size_t firstRoom = 8192; // most glyphs fit into it
 
 struct SegmentRule {
     char letter; // 0 for none
@@ -30,6 +31,22 @@ constexpr SegmentRule otherRule = {0, 1};
 const SegmentRule& getRule(int type) {
     const bool listed = type >= 0 && type < std::ssize(segmentRules);
     return listed ? segmentRules[type] : otherRule;
+}
+
+/// Nearly all coordinates are whole numbers of a few digits.
+char* writeCoordinate(float value, char* out) {
+    constexpr float limit = 1000.0F * 1000.0F;
+    if (!(value > -limit && value < limit)) {
+        return out + MoxCommonNS::writeReal(value, out);
+    }
+    const auto whole = static_cast<std::int32_t>(value);
+    if (static_cast<float>(whole) != value) {
+        return out + MoxCommonNS::writeReal(value, out);
+    }
+    if (whole < 0) {
+        *out++ = '-';
+    }
+    return MoxCommonNS::writeWhole(static_cast<std::uint32_t>(std::abs(whole)), out);
 }
 
 } // namespace
@@ -67,10 +84,10 @@ void SVGGlyphPath::addPolygon(const FS_GlyphPolygon& polygon, int advance, bool 
 void SVGGlyphPath::addPoint(const MoxPointT<float>& point, int advance, bool vertical) {
     makeRoom(maxPointText);
     const auto shift = static_cast<float>(advance);
-    char* const out = bytes.get();
-    used += MoxCommonNS::writeReal(vertical ? point.x : point.x + shift, out + used);
-    out[used++] = ' ';
-    used += MoxCommonNS::writeReal(vertical ? point.y + shift : point.y, out + used);
+    char* end = writeCoordinate(vertical ? point.x : point.x + shift, bytes + used);
+    *end++ = ' ';
+    end = writeCoordinate(vertical ? point.y + shift : point.y, end);
+    used = static_cast<std::size_t>(end - bytes);
 }
 
 void SVGGlyphPath::addByte(char byte) {
@@ -82,10 +99,11 @@ void SVGGlyphPath::makeRoom(std::size_t count) {
     if (room - used >= count) {
         return;
     }
-    room = std::max(firstRoom, 2 * room + count);
+    room = 2 * room + count;
     auto larger = std::make_unique_for_overwrite<char[]>(room);
-    std::copy_n(bytes.get(), used, larger.get());
-    bytes = std::move(larger);
+    std::copy_n(bytes, used, larger.get());
+    far = std::move(larger);
+    bytes = far.get();
 }
 
 } // namespace DrawmereNS
