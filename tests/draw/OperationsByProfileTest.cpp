@@ -4,6 +4,7 @@
 #include "draw/SVGPlazmicImpl.h"
 #include "draw/SVGTinyImpl.h"
 #include "draw/SVGWispImpl.h"
+#include "foundation/records/TLGraphicImage.h"
 #include "state/SVGGraphicContext.h"
 #include "tests/draw/DrawnTree.h"
 #include "tests/draw/QueuedErrors.h"
@@ -71,6 +72,22 @@ std::string fillGradient(DrawmereImpl& impl, const UnicodeString& id) {
     impl.getGContext()->setFillColorId(id);
     drawSquare(impl);
     return utf8(id) + "\n";
+}
+
+/// An image that documents refer to, whatever is in it.
+class PngFile : public TalGraphic::TLGraphicImage {
+public:
+    PngFile() : TLGraphicImage(u"a.png") {}
+
+    TalGraphic::TLGraphicType getGraphicType() override { return TalGraphic::TLGRAPHICTYPE_PNG; }
+
+    std::istream* getStream() override { return nullptr; }
+};
+
+void drawImage(DrawmereImpl& impl) {
+    PngFile image;
+    impl.config->setImageProcessingType(MoxName(u"link"));
+    impl.drawImage(&image, pt(1), pt(2), pt(3), pt(4));
 }
 
 std::string drawClip(DrawmereImpl& impl) {
@@ -165,6 +182,20 @@ const Operation operations[] = {
          return std::string();
      },
      {same, same, same, same, same}},
+    {"drawImage",
+     [](DrawmereImpl& impl) {
+         drawImage(impl);
+         return std::string();
+     },
+     {same, same, same, same, same}},
+    {"drawImageInPattern",
+     [](DrawmereImpl& impl) {
+         std::string id = startPattern(impl);
+         drawImage(impl);
+         impl.endPattern();
+         return id;
+     },
+     {same, same, "\n", "\n", same}},
     {"startClipDef",
      [](DrawmereImpl& impl) {
          impl.startClipDef(OBJECTBOUNDINGBOX);
