@@ -41,7 +41,8 @@ endfunction()
 # The same source once more, with the header in front that lets a test choose the output profile.
 function(drawmere_add_example_for_profiles name)
     add_executable(${name}_profiles ${name}.cpp)
-    target_link_libraries(${name}_profiles PRIVATE drawmere drawmere_flags)
+    # Whatever the example is given later on as well.
+    target_link_libraries(${name}_profiles PRIVATE $<TARGET_PROPERTY:${name},LINK_LIBRARIES>)
     target_compile_definitions(${name}_profiles PRIVATE
         $<TARGET_PROPERTY:${name},COMPILE_DEFINITIONS>
     )

@@ -53,6 +53,20 @@ constexpr KnownFault knownFaults[] = {
     // Every root states the font defaults, though Tiny has no word for one of them.
     {SVGConfig::SVGTYPE_TINY,
      "element svg: validity error : No declaration for attribute font-stretch of element svg", ""},
+    // A glyph for lines that run down says so, though Tiny has no words for it either.
+    {SVGConfig::SVGTYPE_TINY,
+     "element glyph: validity error : No declaration for attribute vert-adv-y of element glyph",
+     ""},
+    {SVGConfig::SVGTYPE_TINY,
+     "element glyph: validity error : No declaration for attribute orientation of element glyph",
+     ""},
+    // An embedded image is used in a frame, an `svg`; the small-device mode takes the frame away.
+    {SVGConfig::SVGTYPE_TINY,
+     "element g: validity error : Element g content does not follow the DTD, expecting (desc | "
+     "title | metadata | animate | set | animateMotion | animateColor | animateTransform | g | defs "
+     "| use | switch | image | path | rect | circle | line | ellipse | polyline | polygon | text | a "
+     "| font | font-face | foreignObject)*, got (svg)",
+     ""},
     // An embedded font is its own source.
     {everyProfile,
      "element font-face: validity error : Element font-face content does not follow the DTD, "
@@ -167,7 +181,7 @@ std::string findUnflattened(const XmlReading& reading) {
         const bool isList =
             event.name == "text" &&
             (event.attribute("x") + event.attribute("y")).find(' ') != std::string::npos;
-        if (event.name == "a" || isList) {
+        if (event.name == "a" || event.name == "use" || isList) {
             return event.name;
         }
     }
