@@ -86,7 +86,7 @@ bool FS_CompositeGuard::isComposite(std::uint32_t place) const {
 // A glyph that ends where it begins is empty, whatever stands there. The last one may lack an end.
 bool FS_CompositeGuard::findGlyph(unsigned glyphId, std::uint32_t& place) const {
     unsigned char entries[8] = {};
-    const FT_ULong size = longPlaces ? 4 : 2;
+    const FT_Long size = longPlaces ? 4 : 2;
     const auto read = longPlaces ? readLong : readHalved;
     const bool hasEnd = readTable(TTAG_loca, glyphId * size, entries, 2 * size);
     if (!hasEnd && !readTable(TTAG_loca, glyphId * size, entries, size)) {
@@ -97,7 +97,7 @@ bool FS_CompositeGuard::findGlyph(unsigned glyphId, std::uint32_t& place) const 
 }
 
 // Reads on behind the end of a table that is too short, as FreeType does for loca.
-bool FS_CompositeGuard::readTable(FT_ULong tag, FT_ULong place, unsigned char* bytes,
+bool FS_CompositeGuard::readTable(FT_ULong tag, FT_Long place, unsigned char* bytes,
                                   FT_ULong count) const {
     return FT_Load_Sfnt_Table(face, tag, place, bytes, &count) == 0;
 }

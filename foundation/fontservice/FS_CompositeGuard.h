@@ -22,7 +22,7 @@ private:
     bool countParts(unsigned glyphId, int depth, int& budget) const;
     bool isComposite(std::uint32_t place) const;
     bool findGlyph(unsigned glyphId, std::uint32_t& place) const;
-    bool readTable(FT_ULong tag, FT_ULong place, unsigned char* bytes, FT_ULong count) const;
+    bool readTable(FT_ULong tag, FT_Long place, unsigned char* bytes, FT_ULong count) const;
 
     FT_Face face; // borrowed
     bool hasComposites = false;

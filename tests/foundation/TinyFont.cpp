@@ -212,7 +212,8 @@ std::string TinyFont::buildVariations() const {
         for (int i = 0; i < axisCount && glyph.pointCount > 0; ++i) {
             std::string data(1, '\0'); // all points
             for (int point = 0; point < glyph.pointCount; ++point) {
-                data += '\x40' + word(100 * (i + 1));
+                data += '\x40';
+                data += word(100 * (i + 1));
             }
             data += '\x83';                                               // four that stay
             data += static_cast<char>(0x80 | (glyph.pointCount + 4 - 1)); // no change upwards
@@ -223,7 +224,8 @@ std::string TinyFont::buildVariations() const {
             deltas += data;
         }
         if (!headers.empty()) {
-            bodies += words({axisCount, static_cast<int>(headers.size()) + 4}) + headers + deltas;
+            bodies += words({axisCount, static_cast<int>(headers.size()) + 4});
+            bodies += headers + deltas;
             pad(bodies);
         }
         offsets += dword(static_cast<std::int64_t>(bodies.size()));
