@@ -32,9 +32,15 @@ using TalFont::TLStringWithGlyphInfo;
 ///   in one text, even where each letter has a position.
 /// - Letters that were shaped in two ways, small capitals beside lower case, go to two fonts: one
 ///   more name in `FS_ExtraFonts` for the same file makes a second font of it.
-/// - A run with kerning is drawn in pieces, each at its own place.
+/// - A run with kerning is drawn in pieces, each at its own place. Pieces don't begin within an
+///   Indic syllable, which viewers without the font would shape anew.
+/// - The weight and slant that are asked for are those of a face that there is: the font is written
+///   with those of the face that was found, and viewers pass over a font of another slant.
+/// - A viewer of vertical text places a glyph by rules of its own, as the font says nothing of
+///   where it starts; where the last tenth of an em counts, vertical forms are drawn one by one in
+///   horizontal text.
 /// Chromium, Firefox and librsvg draw no fonts of this kind at all; they take a face of the system
-/// by the family name.
+/// by the family name. WebKit draws no Arabic letter from one.
 class DRAWMERE_API SVGFontManager {
 public:
     /// Borrows: `treeManager`, for its own life.
