@@ -14,18 +14,6 @@ namespace MoxFontService_NS {
 namespace {
 
 constexpr int neutralUnitsPerEm = 1000;
-constexpr int lastCodePoint = 0x10FFFF;
-
-// How many characters a handle remembers the glyphs of, and the bits of that number.
-constexpr std::uint32_t knownGlyphBits = 11;
-constexpr std::uint32_t knownGlyphCount = 1U << knownGlyphBits;
-
-// Spreads keys that follow each other, and those of distant scripts.
-std::uint32_t placeOf(std::uint32_t key) {
-    constexpr std::uint32_t spread = 0x9E3779B1; // 2^32 over the golden ratio
-    constexpr std::uint32_t wordBits = 32;
-    return key * spread >> (wordBits - knownGlyphBits);
-}
 
 int saturatedAbs(int number) {
     return number == std::numeric_limits<int>::min() ? std::numeric_limits<int>::max()
@@ -59,7 +47,6 @@ bool FS_FontInfo::createFont(const UnicodeString& name, int weight, bool italic,
         return false;
     }
     found = std::move(opened);
-    knownGlyphs.clear();
     return true;
 }
 
@@ -85,19 +72,7 @@ int FS_FontInfo::getUnitsPerEm() const {
 }
 
 unsigned short FS_FontInfo::getGlyphID(int codePoint, bool vertical) const {
-    if (!found || codePoint < 0 || codePoint > lastCodePoint) {
-        return noGlyph;
-    }
-    if (knownGlyphs.empty()) {
-        knownGlyphs.resize(knownGlyphCount);
-    }
-    // Never 0, which marks a place that is free.
-    const std::uint32_t key = 2 * static_cast<std::uint32_t>(codePoint) + (vertical ? 2 : 1);
-    KnownGlyph& known = knownGlyphs[placeOf(key)];
-    if (known.key != key) {
-        known = {key, found->face->findGlyph(codePoint, vertical)};
-    }
-    return known.glyphId;
+    return found ? found->face->findGlyph(codePoint, vertical) : noGlyph;
 }
 
 bool FS_FontInfo::getGlyphDrawInfo(unsigned short glyphId, FS_GlyphDrawInfo& info,

@@ -7,9 +7,7 @@
 #include "foundation/fontservice/FS_GlyphDrawInfo.h"
 #include "foundation/fontservice/FS_NewTextMetricEx.h"
 
-#include <cstdint>
 #include <memory>
-#include <vector>
 
 namespace MoxFontService_NS {
 
@@ -21,8 +19,8 @@ struct FS_FoundFace;
 ///
 /// A handle without a face answers neutral values: 1000 units per em, as SVG 1.1 has it where
 /// nothing is said, weight 400, upright, no family name, no glyph, a width of 0. Faces are shared
-/// by all handles of the process; handles on two threads may use one face, a single handle stays
-/// on one thread, constant or not. Copies share the face.
+/// by all handles of the process, on any thread; a handle that nobody changes may be used by
+/// several. Copies share the face.
 class FS_FontInfo {
 public:
     static constexpr unsigned short noGlyph = 65535;
@@ -59,7 +57,8 @@ public:
     int getUnitsPerEm() const;
 
     /// Returns: the number of the glyph for `codePoint`, with `vertical` that of the form which
-    /// the font substitutes in vertical text, if any; `noGlyph` when the face has none.
+    /// the font substitutes in vertical text, if any; `noGlyph` when the face has none. It is
+    /// looked up each time: who asks for every character of a text remembers the answers.
     unsigned short getGlyphID(int codePoint, bool vertical) const;
 
     /// Fills `info` with the unhinted outline; vectors in it are used again.
@@ -76,13 +75,7 @@ public:
     void getOutlineTextMetrics(FS_NewTextMetricEx& metrics, int size) const;
 
 private:
-    struct KnownGlyph {
-        std::uint32_t key = 0;
-        std::uint16_t glyphId = 0;
-    };
-
     std::shared_ptr<const FS_FoundFace> found;
-    mutable std::vector<KnownGlyph> knownGlyphs; // filled as characters are asked for
 };
 
 } // namespace MoxFontService_NS

@@ -227,7 +227,7 @@ TEST(FS_FontInfo, WhatIsNoCharacterHasNoGlyph) {
     EXPECT_NE(font.getGlyphID(0x20, false), 65535);
 }
 
-TEST(FS_FontInfo, RememberedGlyphsAreThoseOfTheFace) {
+TEST(FS_FontInfo, GlyphsAreTheSameForEachHandleAndEachTime) {
     const FS_FontInfo font = createFromFile("Lobster.ttf");
     const FS_FontInfo other = createFromFile("Lobster.ttf");
     for (int round = 0; round < 2; ++round) {
