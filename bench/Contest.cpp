@@ -80,7 +80,7 @@ void printContest(const Contest& contest) {
         printRow(contest.contenders[i].name, rows[i], rows[0]);
     }
     if (contest.goal > 0.0) {
-        std::printf("  goal for %s: at most %.1fx\n", contest.contenders[1].name.c_str(),
+        std::printf("  goal for %s: at most %.2fx\n", contest.contenders[1].name.c_str(),
                     contest.goal);
     }
     if (contest.bytesGoal > 0.0) {

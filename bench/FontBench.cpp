@@ -88,6 +88,7 @@ ContestResult drawRuns(const Runs& runs, Taking taking) {
         drawmere.setFont(&fonts.back(), nullptr); // opens the face, once a document
     }
     const Stopwatch watch;
+    TalFont::TLStringWithGlyphInfo glyphs;
     std::size_t script = benchScriptCount;
     float y = 0.0F;
     for (const BenchRun& run : runs) {
@@ -96,8 +97,10 @@ ContestResult drawRuns(const Runs& runs, Taking taking) {
             drawmere.setFont(&fonts[script], nullptr);
         }
         y += 0.125F;
-        auto* glyphs = const_cast<TalFont::TLStringWithGlyphInfo*>(&run.glyphs);
-        drawmere.drawText(run.text, pt(72.25F), pt(y), PAINTMODE_FILL, glyphs,
+        // A formatter has just shaped the run, so its glyphs are at hand and not somewhere in
+        // memory.
+        glyphs.entries.assign(run.glyphs.entries.begin(), run.glyphs.entries.end());
+        drawmere.drawText(run.text, pt(72.25F), pt(y), PAINTMODE_FILL, &glyphs,
                           taking == Taking::wholeRuns, run.leftToRight);
     }
     return {watch.getTime(), 0};

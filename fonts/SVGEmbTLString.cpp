@@ -17,7 +17,7 @@ bool SVGEmbTLString::operator<(const SVGEmbTLString& other) const {
     if (length() != other.length()) {
         return length() > other.length();
     }
-    return compare(other) > 0;
+    return viewOf(*this) > viewOf(other);
 }
 
 } // namespace DrawmereNS
