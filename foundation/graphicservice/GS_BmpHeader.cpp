@@ -106,7 +106,7 @@ bool isMask(std::uint32_t mask, int depth) {
 /// Takes the masks, which lie behind the fields of a plain header, inside a longer one or not.
 bool takeMasks(const RawHeader& raw, std::uint32_t compression, GS_BmpHeader& header) {
     const bool hasAlpha = compression == alphaBitFields || raw.size >= alphaMaskedSize;
-    for (int i = 0; i < (hasAlpha ? 4 : 3); ++i) {
+    for (std::size_t i = 0; i < (hasAlpha ? 4U : 3U); ++i) {
         header.masks[i] = readLittle32(raw.bytes + infoSize + i * 4);
     }
     const bool hasColors = header.masks[0] != 0 && header.masks[1] != 0 && header.masks[2] != 0;

@@ -95,13 +95,14 @@ private:
     /// padding that rows without runs have.
     void put(int value) {
         if (x < bitmap.columns && y < bitmap.rows) {
-            setColor(bitmap.getRow(bitmap.rows - 1 - y) + x * bitmap.channels, value);
+            const std::ptrdiff_t offset = std::ptrdiff_t{x} * bitmap.channels;
+            setColor(bitmap.getRow(bitmap.rows - 1 - y) + offset, value);
             ++x;
         }
     }
 
     void setColor(std::uint8_t* pixel, int value) const {
-        const std::uint8_t* entry = header.palette.data() + value * 4;
+        const std::uint8_t* entry = header.palette.data() + std::ptrdiff_t{value} * 4;
         pixel[0] = entry[2];
         pixel[1] = entry[1];
         pixel[2] = entry[0];

@@ -115,7 +115,7 @@ void placeLine(const GifFile& file, const std::vector<GifByteType>& line, int y,
         }
         const bool isListed = index < colors.ColorCount;
         const GifColorType color = isListed ? colors.Colors[index] : GifColorType{0, 0, 0};
-        std::uint8_t* pixel = row + (x + picture.Left) * bitmap.channels;
+        std::uint8_t* pixel = row + std::ptrdiff_t{x + picture.Left} * bitmap.channels;
         pixel[0] = color.Red;
         pixel[1] = color.Green;
         pixel[2] = color.Blue;

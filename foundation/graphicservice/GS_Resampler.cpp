@@ -15,15 +15,13 @@ class Curve {
 public:
     Curve() {
         for (std::size_t i = 0; i < linear.size(); ++i) {
-            linear[i] = makeLinear(static_cast<double>(i) / static_cast<double>(fullByte));
+            linear[i] = static_cast<float>(makeLinear(static_cast<double>(i)));
         }
         std::size_t byte = 0;
         for (std::size_t i = 0; i < bytes.size(); ++i) {
             // The next byte begins half way, as seen by the eye.
-            while (byte < UINT8_MAX &&
-                   static_cast<double>(i) / steps >=
-                       static_cast<double>(makeLinear((static_cast<double>(byte) + 0.5) /
-                                                      static_cast<double>(fullByte)))) {
+            const double middle = (static_cast<double>(i) + 0.5) / steps;
+            while (byte < UINT8_MAX && middle >= makeLinear(static_cast<double>(byte) + 0.5)) {
                 ++byte;
             }
             bytes[i] = static_cast<std::uint8_t>(byte);
@@ -34,20 +32,21 @@ public:
 
     std::uint8_t toByte(float value) const {
         const float inside = std::clamp(value, 0.0F, 1.0F);
-        return bytes[static_cast<std::size_t>(inside * static_cast<float>(steps) + 0.5F)];
+        return bytes[static_cast<std::size_t>(inside * static_cast<float>(steps))];
     }
 
 private:
     static constexpr int steps = 65535;
 
-    static float makeLinear(double value) {
+    /// Returns: the light of a byte, or of what lies between two, from 0 to 1.
+    static double makeLinear(double byte) {
         constexpr double straightEnd = 0.04045;
         constexpr double slope = 12.92;
         constexpr double offset = 0.055;
         constexpr double power = 2.4;
-        return static_cast<float>(value <= straightEnd
-                                      ? value / slope
-                                      : std::pow((value + offset) / (1.0 + offset), power));
+        const double value = byte / UINT8_MAX;
+        return value <= straightEnd ? value / slope
+                                    : std::pow((value + offset) / (1.0 + offset), power);
     }
 
     std::array<float, 256> linear = {};
@@ -59,7 +58,7 @@ const Curve& getCurve() {
     return curve;
 }
 
-/// Returns: how much of the area of a new pixel, one long, lies at `distance` from its middle.
+// The weight of an old pixel by its distance from the middle of the new one, in new pixels.
 float weighTriangle(float distance) { return std::max(0.0F, 1.0F - std::fabs(distance)); }
 
 float weighCubic(float distance) {
@@ -171,7 +170,7 @@ template <int channels> void storeRow(const float* from, int columns, std::uint8
             to[i] = alpha > 0.0F ? curve.toByte(from[i] / alpha) : std::uint8_t{0};
         }
         if constexpr (hasAlpha) {
-            to[channels - 1] = static_cast<std::uint8_t>(alpha * fullByte + 0.5F);
+            to[channels - 1] = static_cast<std::uint8_t>(std::lround(alpha * fullByte));
         }
     }
 }

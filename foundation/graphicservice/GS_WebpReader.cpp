@@ -129,7 +129,8 @@ bool decodeFrame(const WebPIterator& frame, GS_Bitmap& bitmap) {
         frame.y_offset + frame.height > bitmap.rows) {
         return false;
     }
-    std::uint8_t* target = bitmap.getRow(frame.y_offset) + frame.x_offset * bitmap.channels;
+    std::uint8_t* target =
+        bitmap.getRow(frame.y_offset) + std::ptrdiff_t{frame.x_offset} * bitmap.channels;
     const std::uint8_t* end = bitmap.getRow(bitmap.rows);
     const auto room = static_cast<std::size_t>(end - target);
     const auto stride = static_cast<int>(bitmap.getRowSize());
