@@ -14,14 +14,18 @@ struct Tag {
     std::uint32_t value;
 };
 
-/// A file of 2 by 1 pixels with `pixels` in one strip; each tag is of one short value. What stands
-/// in `longValues` lies behind the pixels, with a tag for bytes (1) and their number.
+/// A file of 2 by 1 pixels with `pixels` in one strip; each tag is of one short value and stands
+/// for the usual one. A profile lies behind the pixels.
 std::string makeTiff(const std::string& pixels, std::vector<Tag> tags,
                      const std::string& profile = std::string()) {
     constexpr std::uint32_t pixelOffset = 8;
     const auto size = static_cast<std::uint32_t>(pixels.size());
-    tags.insert(tags.end(),
-                {{256, 2}, {257, 1}, {259, 1}, {273, pixelOffset}, {278, 1}, {279, size}});
+    for (const Tag& usual : {Tag{256, 2}, Tag{257, 1}, Tag{259, 1}, Tag{273, pixelOffset},
+                             Tag{278, 1}, Tag{279, size}}) {
+        if (std::ranges::find(tags, usual.number, &Tag::number) == tags.end()) {
+            tags.push_back(usual);
+        }
+    }
     std::ranges::sort(tags, {}, &Tag::number);
     const auto directory = pixelOffset + size + static_cast<std::uint32_t>(profile.size());
     const std::uint32_t count = static_cast<std::uint32_t>(tags.size()) + (profile.empty() ? 0 : 1);
@@ -38,7 +42,8 @@ std::string makeTiff(const std::string& pixels, std::vector<Tag> tags,
     return file + little(0, 4);
 }
 
-// Tags: 258 bits of a sample, 262 colours, 274 orientation, 277 samples, 338 further samples.
+// Tags: 259 compression, 258 bits of a sample, 262 colours, 274 orientation, 277 samples, 338
+// further samples.
 
 const std::vector<Tag> grey = {{258, 8}, {262, 1}, {277, 1}};
 
@@ -47,6 +52,14 @@ TEST(GS_TiffReader, GreyStaysGrey) {
     ASSERT_TRUE(image.hasPixels);
     EXPECT_EQ(image.bitmap.channels, 1);
     EXPECT_EQ(listPixels(image.bitmap), (std::vector<int>{10, 200}));
+}
+
+TEST(GS_TiffReader, DeflateIsDecoded) {
+    const std::string stored = bytesOf({0x78, 1, 1, 2, 0, 0xFD, 0xFF, 10, 200, 0, 0xDE, 0, 0xD3});
+    std::vector<Tag> tags = grey;
+    tags.push_back({259, 8});
+    EXPECT_EQ(listPixels(decodeImage(makeTiff(stored, tags)).bitmap), (std::vector<int>{10, 200}));
+    EXPECT_FALSE(decodeImage(makeTiff(stored.substr(0, 7), tags)).hasPixels);
 }
 
 TEST(GS_TiffReader, WhiteMayBeZero) {
