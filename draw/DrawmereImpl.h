@@ -260,8 +260,7 @@ private:
                                    GRADSPERADMOD spread);
 
     bool hasLinks = false;
-    bool wantsWalk =
-        false; ///< the tree may have been changed by others, or an anchor stand elsewhere
+    bool wantsWalk = false; ///< the tree may have been changed by others
     std::vector<MoxPtr<MoxElement>> pageAnchors;
 };
 

@@ -2,7 +2,6 @@
 #include "draw/DrawmereImpl.h"
 #include "foundation/common/MoxNameTable.h"
 #include "refs/SVGReferenceId.h"
-#include "tree/SVGTreeManager.h"
 
 namespace DrawmereNS {
 namespace {
@@ -48,8 +47,6 @@ void DrawmereImpl::setInternalLinkAnchor(UnicodeString id, float /*x*/, float y)
     anchor->setSVGAttribute(SVGName::id, id);
     if (SVGReferenceId::isPageReferenceId(id)) {
         pageAnchors.emplace_back(anchor.get());
-        // A saved cursor may mean a definition, which stands before all that was drawn so far.
-        wantsWalk = wantsWalk || !treeManager->nodeStack.empty();
     }
     group->appendChild(anchor.get());
     addElement(group.get(), /*direct=*/false, /*makeCurrent=*/false);

@@ -5,6 +5,7 @@
 #include "foundation/common/MoxCStr.h"
 #include "foundation/common/MoxNameTable.h"
 #include "foundation/common/MoxNamedValueMap.h"
+#include "foundation/names/SVGName.h"
 #include "frontend/DrawmereError.h"
 #include "refs/SVGReferenceId.h"
 
@@ -13,8 +14,11 @@
 namespace DrawmereNS {
 namespace {
 
+using MoxCommonNS::MoxElement;
 using MoxCommonNS::MoxNamedValueMap;
 using MoxCommonNS::MoxNameEnum;
+using MoxCommonNS::MoxNode;
+using TalCommon::SVGName;
 
 /// The text of a destination: that of a name or a string, nothing of any other value.
 UnicodeString toDestination(const MoxValue& value) {
@@ -23,11 +27,42 @@ UnicodeString toDestination(const MoxValue& value) {
     return isText ? value.toString() : UnicodeString();
 }
 
-bool standsIn(const MoxDocument& document, const MoxCommonNS::MoxNode* node) {
-    while (node && node != &document) {
-        node = node->parentLink();
+bool isDefinitions(const MoxNode& node) {
+    return node.kindLink() == MoxCommonNS::MOXNODE_ELEMENT &&
+           static_cast<const MoxElement&>(node).localLink() == MoxName(SVGName(SVGName::defs));
+}
+
+enum class Place : std::uint8_t { nowhere, page, definition };
+
+/// Where in `document` an anchor stands.
+Place findPlace(const MoxDocument& document, const MoxNode* anchor) {
+    Place place = Place::page;
+    while (anchor && anchor != &document) {
+        place = isDefinitions(*anchor) ? Place::definition : place;
+        anchor = anchor->parentLink();
     }
-    return node != nullptr;
+    return anchor ? place : Place::nowhere;
+}
+
+/// Solves page anchors of a document without links, given in the order in which they were made.
+/// Returns: false, with nothing changed, when that is not the order in which they stand: a
+/// definition stands before all that was drawn ahead of it.
+bool solveAnchors(SVGReferenceId& references, const MoxDocument& document,
+                  const std::vector<MoxPtr<MoxElement>>& anchors) {
+    std::vector<MoxElement*> standing;
+    for (const auto& anchor : anchors) {
+        const Place place = findPlace(document, anchor.get());
+        if (place == Place::definition) {
+            return false;
+        }
+        if (place == Place::page) {
+            standing.push_back(anchor.get());
+        }
+    }
+    for (MoxElement* anchor : standing) {
+        references.solvePageAnchor(anchor);
+    }
+    return true;
 }
 
 constexpr MoxNameEnum destinationKeys[] = {
@@ -105,14 +140,8 @@ void Drawmere::solveDocument(SVGReferenceId& references, std::int32_t page, MoxD
         return;
     }
     kept.isSolved = true;
-    if (!kept.isLinkless) {
+    if (!kept.isLinkless || !solveAnchors(references, document, kept.anchors)) {
         references.solveReferenceId(page, document.getDocumentElement());
-        return;
-    }
-    for (const auto& anchor : kept.anchors) {
-        if (standsIn(document, anchor.get())) {
-            references.solvePageAnchor(anchor.get());
-        }
     }
 }
 
