@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cmath>
 #include <limits>
 
 namespace DrawmereTest {
@@ -82,6 +83,9 @@ TEST(DrawmereImplArcs, LengthsOfAnArcUpToAThousandthOfAMillimetreAreZeroAndItsAn
     EXPECT_EQ(arcText({.x = 0.0028F, .y = -0.0F}), "A10 20 30 0 0 0 0");
     EXPECT_EQ(arcText({.rx = 0.0029F, .y = -0.0029F}), "A0.0029 20 30 0 0 40 -0.0029");
     EXPECT_EQ(arcText({.angle = 0.0001F}), "A10 20 0.0001 0 0 40 50");
+    constexpr float limit = MoxLength(0.001F, MoxCommonNS::MOXUNIT_MM).getRawValue();
+    EXPECT_EQ(arcText({.rx = limit, .x = -limit}), "A0 20 30 0 0 0 50");
+    EXPECT_NE(arcText({.rx = std::nextafter(limit, 1.0F)}), "A0 20 30 0 0 40 50");
 }
 
 TEST(DrawmereImplArcs, InTheSmallDeviceModeLengthsOfAnArcHaveOneDecimal) {

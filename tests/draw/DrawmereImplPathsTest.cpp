@@ -71,6 +71,16 @@ TEST(DrawmereImplPaths, APathJoinsTheOpenGroupAndIsTheLastInIt) {
     EXPECT_GOLDEN(page, "path/last-of-its-group");
 }
 
+TEST(DrawmereImplPaths, APathClosesAGroupOfAnotherKind) {
+    SvgPage page;
+    SVGGroupManager& groups = *page.drawmere.impl->groupManager;
+    groups.setElemMode(PAINTMODE_NONE, ELEMENTTYPE_IMAGE);
+    groups.addElement(page.drawmere.impl->getDocument()->createSVGElement(SVGName::image).get());
+    drawStroke(page, 20, PAINTMODE_NONE);
+    EXPECT_EQ(page.body(),
+              "<g>\n<image/>\n</g>\n<g>\n<path d=\"M20,10l20,20\" fill=\"none\"/>\n</g>");
+}
+
 TEST(DrawmereImplPaths, EachPathHasAGroupOfItsOwn) {
     SvgPage page;
     page->setLineCap(LINECAP_ROUND);
@@ -243,6 +253,7 @@ TEST(DrawmereImplPaths, TheStateOfThePageIsBackWhenThePathEnds) {
     page->startPathData();
     EXPECT_NE(page.drawmere.impl->getGContext(), state);
     EXPECT_EQ(page.drawmere.impl->groupManager->getType(), 4);
+    EXPECT_EQ(page.drawmere.impl->groupManager->getTreeManager(), page.drawmere.impl->treeManager);
     page->setPathMoveTo(at(10, 10));
     page->endPathData(PAINTMODE_STROKE);
     EXPECT_EQ(page.drawmere.impl->getGContext(), state);
