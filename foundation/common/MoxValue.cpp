@@ -136,6 +136,9 @@ MoxValue::MoxValue(const MoxNamedValueMap& map) {
 }
 
 MoxValue MoxValue::fromAscii(std::string_view text) {
+    if (text.size() > static_cast<std::size_t>(std::numeric_limits<std::int32_t>::max())) {
+        throw std::bad_alloc(); // as far as a string can count
+    }
     if (!isAscii(text)) {
         return {fromBytes(text.data(), text.size())};
     }

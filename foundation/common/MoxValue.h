@@ -96,6 +96,7 @@ public:
 
     /// A string value of plain ASCII bytes, as path data and keywords have them. Bytes above 127
     /// are taken as the characters of that number.
+    /// Throws: std::bad_alloc for a text that is longer than a string can be.
     static MoxValue fromAscii(std::string_view text);
 
     /// A string value whose text lies in `block` already, for a text too large to be copied: it

@@ -7,6 +7,7 @@
 #include <cmath>
 #include <gtest/gtest.h>
 #include <limits>
+#include <new>
 #include <vector>
 
 namespace {
@@ -140,6 +141,11 @@ TEST(MoxValue, IsMadeFromAsciiBytesToo) {
     EXPECT_EQ(MoxValue::fromAscii(""), MoxValue(u""));
     EXPECT_EQ(MoxValue::fromAscii("caf\xE9"), MoxValue(u"caf\u00E9"));
     EXPECT_TRUE(MoxValue::fromAscii("\x80").isWideText());
+}
+
+TEST(MoxValue, AsciiBytesBeyondWhatAStringCanCountAreRefusedUnread) {
+    constexpr std::size_t tooMany = std::size_t{INT32_MAX} + 1;
+    EXPECT_THROW(MoxValue::fromAscii({"", tooMany}), std::bad_alloc);
 }
 
 /// Returns: a value that took over a block with `text` in its middle.
