@@ -134,9 +134,9 @@ double findMedian(const std::vector<Times>& all, double Times::*member) {
 }
 
 template <typename Draw> Times runRounds(Draw draw, const Input& input, std::size_t count) {
-    std::vector<Times> all;
-    for (int round = 0; round < (isSmokeRun() ? 1 : rounds); ++round) {
-        all.push_back(runOnce(draw, input, count));
+    std::vector<Times> all(isSmokeRun() ? 1 : rounds);
+    for (Times& times : all) {
+        times = runOnce(draw, input, count);
     }
     return {findMedian(all, &Times::build), findMedian(all, &Times::optimize),
             findMedian(all, &Times::flatten)};

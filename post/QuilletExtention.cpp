@@ -1,8 +1,8 @@
 #include "post/QuilletExtention.h"
 
-#include "foundation/common/MoxDocument.h"
 #include "foundation/common/MoxParser.h"
 #include "foundation/common/MoxTokenizer.h"
+#include "post/ElementWalk.h"
 #include "tree/SVGUtil.h"
 
 #include <algorithm>
@@ -11,8 +11,6 @@
 namespace DrawmereNS {
 namespace {
 
-using MoxCommonNS::MoxDocument;
-using MoxCommonNS::MoxNode;
 using MoxCommonNS::MoxParser;
 using MoxCommonNS::MoxTokenizer;
 
@@ -21,55 +19,13 @@ constexpr char16_t zero[] = u"0";
 constexpr char16_t none[] = u"none";
 constexpr char16_t transparent[] = u"transparent";
 
-const MoxName& getHrefName() {
-    static const MoxName name(u"xlink:href");
-    return name;
-}
-
-MoxElement* toElement(MoxNode* node) {
-    const bool isElement = node && node->kindLink() == MoxCommonNS::MOXNODE_ELEMENT;
-    return isElement ? static_cast<MoxElement*>(node) : nullptr;
-}
-
 /// Passes that one walk can do together.
 constexpr unsigned PASS_LINKS = 1;
 constexpr unsigned PASS_TEXTS = 2;
 constexpr unsigned PASS_COLORS = 4;
 
-bool hasName(const MoxElement& element, SVGName name) {
-    return element.localLink() == MoxName(name);
-}
-
-/// Returns: the first element among `node` and its next siblings, or null.
-MoxElement* findElement(MoxNode* node) {
-    while (node && !toElement(node)) {
-        node = node->nextLink();
-    }
-    return toElement(node);
-}
-
-/// Returns: the element behind `node` in the walk over what is below `root`, in document order;
-/// one `below` the node itself too when that is set. Null at the end.
-MoxElement* findNext(MoxNode* node, const MoxNode* root, bool below) {
-    MoxElement* next = below ? findElement(node->firstLink()) : nullptr;
-    while (!next && node != root) {
-        next = findElement(node->nextLink());
-        node = node->parentLink();
-    }
-    return next;
-}
-
 UnicodeString readText(const MoxElement& element, MoxName name) {
     return element.getAttribute(name).toString();
-}
-
-void copyAttribute(const MoxElement& from, MoxElement& to, MoxName name) {
-    to.setAttribute(name, from.getAttribute(name));
-}
-
-MoxPtr<MoxElement> makeElement(const MoxElement& relative, SVGName name) {
-    MoxDocument* document = relative.getOwnerDocument();
-    return document ? document->createElement(name) : MoxPtr<MoxElement>();
 }
 
 void removeTexts(MoxElement& element) {
@@ -123,36 +79,6 @@ std::vector<UnicodeString> readRotations(const MoxElement& text) {
     return list;
 }
 
-/// The text of a name or a string, nothing of any other value.
-UnicodeString readId(const MoxElement& element) {
-    const MoxValue& id = element.getAttribute(SVGName(SVGName::id));
-    const bool isText =
-        id.getType() == MoxCommonNS::MOXVALUE_NAME || id.getType() == MoxCommonNS::MOXVALUE_STRING;
-    return isText ? id.toString() : UnicodeString();
-}
-
-MoxElement* findDefs(const MoxElement& root) {
-    MoxElement* child = findElement(root.firstLink());
-    while (child && !hasName(*child, SVGName::defs)) {
-        child = findElement(child->nextLink());
-    }
-    return child;
-}
-
-/// Finds the images of `defs` by their references and takes their ids away. Of two with one id the
-/// first is found.
-std::map<UnicodeString, MoxElement*> takeImages(const MoxElement& defs) {
-    std::map<UnicodeString, MoxElement*> images;
-    for (MoxElement* child = findElement(defs.firstLink()); child;
-         child = findElement(child->nextLink())) {
-        if (hasName(*child, SVGName::image)) {
-            images.emplace(u"#" + readId(*child), child);
-            child->removeAttribute(SVGName(SVGName::id));
-        }
-    }
-    return images;
-}
-
 /// Returns: whether the value is one coordinate, in whatever form.
 bool isOneCoordinate(const MoxValue& value) {
     if (value.getType() != MoxCommonNS::MOXVALUE_STRING) {
@@ -160,31 +86,6 @@ bool isOneCoordinate(const MoxValue& value) {
     }
     const bool isPlain = !value.isWideText() && !value.getAsciiText().empty();
     return isPlain && value.getAsciiText().find(' ') == std::string_view::npos;
-}
-
-/// Puts a copy of `image` in the place of `frame`, and of its size.
-void placeImage(MoxElement& frame, const MoxElement& image) {
-    const MoxPtr<MoxElement> copy = makeElement(frame, SVGName::image);
-    MoxNode* const parent = frame.getParentNode();
-    if (!copy || !parent) {
-        return;
-    }
-    for (const SVGName::Number name : {SVGName::width, SVGName::height, SVGName::x, SVGName::y}) {
-        copyAttribute(frame, *copy, SVGName(name));
-    }
-    copyAttribute(image, *copy, SVGName(SVGName::preserveAspectRatio));
-    copyAttribute(image, *copy, getHrefName());
-    parent->replaceChild(copy.get(), &frame);
-}
-
-/// Returns: the image that the `use` in `frame` refers to, or null.
-MoxElement* findUsedImage(const MoxElement& frame,
-                          const std::map<UnicodeString, MoxElement*>& images) {
-    static const MoxName href(u"href");
-    const MoxElement* use = findElement(frame.firstLink());
-    const auto found = images.find(
-        use->getAttributeNS(MoxName(MoxCommonNS::MOXNAME_XLINK_NAMESPACE), href).toString());
-    return found == images.end() ? nullptr : found->second;
 }
 
 /// Returns: whether `paint` is "none", or a colour in the form that it would get.
@@ -374,48 +275,6 @@ MoxPtr<MoxElement> QuilletExtention::createSplitTextNode(const UnicodeString& x,
     }
     split->appendChildText(text);
     return split;
-}
-
-void QuilletExtention::embedImageDirect(MoxElement* root) {
-    MoxElement* defs = root ? findDefs(*root) : nullptr;
-    std::map<UnicodeString, MoxElement*> images;
-    if (defs) {
-        images = takeImages(*defs);
-    }
-    if (images.empty()) {
-        return;
-    }
-    execEmbedDirect(root, images);
-    for (const auto& entry : images) {
-        defs->removeChild(entry.second);
-    }
-    images.clear();
-    if (!defs->firstLink()) {
-        root->removeChild(defs);
-    }
-}
-
-void QuilletExtention::execEmbedDirect(MoxElement* element,
-                                       std::map<UnicodeString, MoxElement*>& images) {
-    MoxElement* child = element;
-    while (child) {
-        const bool isFrame = isImageRefSvgElement(child);
-        const bool below = !isFrame && !hasName(*child, SVGName::defs);
-        MoxElement* const next = findNext(child, element, below);
-        const MoxElement* image = isFrame ? findUsedImage(*child, images) : nullptr;
-        if (image) {
-            placeImage(*child, *image);
-        }
-        child = next;
-    }
-}
-
-bool QuilletExtention::isImageRefSvgElement(MoxElement* element) {
-    if (!element || !hasName(*element, SVGName::svg)) {
-        return false;
-    }
-    MoxElement* const child = findElement(element->firstLink());
-    return child && hasName(*child, SVGName::use) && !findElement(child->nextLink());
 }
 
 } // namespace DrawmereNS

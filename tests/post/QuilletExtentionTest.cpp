@@ -394,7 +394,8 @@ TEST(QuilletExtention, PaintsAreSpeltOutAsNumbers) {
 
     for (const auto& row : rows) {
         const auto make = [](const std::string& paint) {
-            return R"(<rect fill=")" + paint + R"(" x="1" stroke=")" + paint + R"("/>)";
+            std::string rect = "<rect fill=\"";
+            return rect.append(paint).append("\" x=\"1\" stroke=\"").append(paint).append("\"/>");
         };
         EXPECT_EQ(withSpeltColors(make(row.before)), make(row.after)) << row.before;
     }
