@@ -173,7 +173,7 @@ BenchFontFile findBenchFont(const char16_t* name) {
         throw std::runtime_error("no font " + family);
     }
     FcPatternGetInteger(found, FC_INDEX, 0, &face);
-    const BenchFontFile file = {reinterpret_cast<const char*>(path), face};
+    BenchFontFile file = {reinterpret_cast<const char*>(path), face};
     FcPatternDestroy(found);
     return file;
 }

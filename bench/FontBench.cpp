@@ -243,4 +243,11 @@ void run(int argc, char** argv) {
 } // namespace
 } // namespace DrawmereNS
 
-int main(int argc, char** argv) { DrawmereNS::run(argc, argv); }
+int main(int argc, char** argv) {
+    try {
+        DrawmereNS::run(argc, argv);
+    } catch (const std::exception& error) {
+        std::fprintf(stderr, "FontBench: %s\n", error.what());
+        return 1;
+    }
+}

@@ -40,7 +40,7 @@ MoxPtr<SVGElement> makeFontFace(const SVGTreeManager& tree, const UnicodeString&
     int weight = 0;
     bool italic = false;
     face.getFontStyle(&weight, &italic, nullptr);
-    const MoxPtr<SVGElement> element = createElement(tree, SVGName::font_face);
+    MoxPtr<SVGElement> element = createElement(tree, SVGName::font_face);
     element->setSVGAttribute(SVGName::font_family, family);
     element->setSVGAttribute(SVGName::font_weight, makeWeightValue(weight));
     element->setSVGAttribute(SVGName::font_style, italic ? u"italic" : u"normal");
@@ -128,7 +128,7 @@ MoxPtr<SVGElement> SVGEmbFont::convGlyph(const std::vector<FS_GlyphDrawInfo>& in
     if (path.get().empty()) {
         ++emptyCount;
     }
-    const MoxPtr<SVGElement> element =
+    MoxPtr<SVGElement> element =
         createElement(*tree, text.isEmpty() ? SVGName::missing_glyph : SVGName::glyph);
     if (!text.isEmpty()) {
         element->setSVGAttribute(SVGName::unicode, text);

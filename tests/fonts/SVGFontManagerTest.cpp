@@ -241,6 +241,28 @@ TEST(EmbeddedFonts, EachDocumentOfARunCarriesItsOwn) {
     EXPECT_EQ(second.find("<glyph unicode=\"X\""), std::string::npos);
 }
 
+TEST(EmbeddedFonts, EndingADocumentOnceMoreAfterAFailureWritesThemOnceMore) {
+    const TempDir directory;
+    SVGConfig config;
+    config.streamOutput = false;
+    SVGPageUri uri(directory.uri("later/page.svg"));
+    Drawmere drawmere(&config, &uri);
+    drawmere.initRootSvg(directory.uri("later/page.svg"));
+    drawmere.startPage(1, MoxRectT<MoxLength>());
+    SVGFont font = makeFont(uprightFace, false);
+    drawmere.setFont(&font, &testFonts());
+    drawmere.drawText(u"X", pt(1), pt(2), PAINTMODE_FILL, nullptr, false, true);
+    drawmere.endPage();
+    EXPECT_THROW(drawmere.finishRootSvg(), MoxError);
+    std::filesystem::create_directory(directory.path("later"));
+    drawmere.finishRootSvg();
+    drawmere.finish();
+    const std::string document = directory.read("later/page.svg");
+    const std::size_t first = document.find("<glyph unicode=\"X\"");
+    EXPECT_NE(first, std::string::npos);
+    EXPECT_NE(document.find("<glyph unicode=\"X\"", first + 1), std::string::npos);
+}
+
 TEST(EmbeddedFonts, TheSetOfFurtherFontsMayGoBeforeTheDocumentEnds) {
     SvgPage page;
     auto fonts = std::make_unique<FS_ExtraFonts>(testFonts());
