@@ -1,0 +1,34 @@
+/// What a caller of the converter can choose about the pages it draws.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+
+namespace DrawmereConvert {
+
+/// How text is written.
+enum TEXTMODE : std::int32_t {
+    TEXTMODE_OUTLINES = 0, ///< a path for each run of glyphs, exact in every viewer
+    TEXTMODE_FONTS = 1,    ///< positioned text, with the document's own fonts embedded
+    TEXTMODE_PLAIN = 2,    ///< positioned text with the names of the fonts
+};
+
+/// The options of all pages. What the library itself decides stands in `SVGConfig`.
+struct ConvertOptions {
+    TEXTMODE textMode = TEXTMODE_OUTLINES;
+    int shadeDpi = 144; ///< resolution of what can only be shown as an image, shading meshes mainly
+
+    /// Images of more bytes go to a file beside the page, when the page goes to a file.
+    std::size_t maxInlineBytes = 7'300'000;
+
+    int maxDepth = 256; ///< of elements; what would go deeper is drawn without its clip or mask
+
+    // The page of documents that have none of their own, in points.
+    float layoutWidth = 420;
+    float layoutHeight = 595;
+    float layoutEm = 11;
+
+    std::size_t maxMemory = 0; ///< bytes for the parser of the document, 0 for no limit
+};
+
+} // namespace DrawmereConvert

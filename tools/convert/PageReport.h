@@ -1,0 +1,44 @@
+/// What became of a page.
+#pragma once
+
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <vector>
+
+namespace DrawmereConvert {
+
+/// What SVG 1.1 or the chosen options can't say exactly.
+enum APPROXIMATION : std::int32_t {
+    APPROXIMATION_BLEND = 0, ///< drawn without its blend mode
+    APPROXIMATION_KNOCKOUT,  ///< a knockout group drawn as a plain one
+    APPROXIMATION_OVERPRINT, ///< drawn without overprint
+    APPROXIMATION_MASK,      ///< a mask put on parts one by one, or left out
+    APPROXIMATION_SHADING,   ///< a shading drawn as an image
+    APPROXIMATION_PATTERN,   ///< a tiling pattern whose cells overlap, drawn cut off
+    APPROXIMATION_IMAGE,     ///< an image decoded and written in another form
+    APPROXIMATION_TEXT,      ///< text drawn as outlines though the mode asks for text
+    APPROXIMATION_FONT,      ///< a font that can't be embedded, replaced by its name
+    APPROXIMATION_DEPTH,     ///< a clip or group left out where elements nest too deep
+    APPROXIMATION_COUNT,
+};
+
+/// Returns: the words for `count` of `kind`, for instance "2 blend modes left out".
+std::string describeApproximation(APPROXIMATION kind, int count);
+
+struct PageReport {
+    void note(APPROXIMATION kind) { ++approximations.at(static_cast<std::size_t>(kind)); }
+
+    /// Adds what `other` counted and said.
+    void add(const PageReport& other);
+
+    /// Returns: the sum of all counts.
+    int countApproximations() const;
+
+    std::array<int, APPROXIMATION_COUNT> approximations{};
+    bool isComplete = true;            ///< false when a part of the page is missing
+    std::vector<std::string> messages; ///< errors and warnings of the parser, without repetitions
+};
+
+} // namespace DrawmereConvert
