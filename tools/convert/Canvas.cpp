@@ -1,13 +1,17 @@
 #include "tools/convert/Canvas.h"
 
-#include <algorithm>
+#include <utility>
 
 namespace DrawmereConvert {
 namespace {
 
-constexpr float hairWidth = 0.15F; // a line of no width is the thinnest that can be seen
+constexpr std::size_t maxTextPoints = 20000; // no viewer likes endless paths
 
-bool isNone(const Paint& paint) { return viewOf(paint.id) == u"none"; }
+MoxPointT<MoxLength> place(const fz_point& point) { return {pt(point.x), pt(point.y)}; }
+
+MoxRectT<MoxLength> place(const fz_rect& rect) {
+    return {pt(rect.x0), pt(rect.y0), pt(rect.x1), pt(rect.y1)};
+}
 
 } // namespace
 
@@ -22,58 +26,78 @@ SVGMatrix toMatrix(const fz_matrix& matrix) {
 }
 
 void Canvas::fill(const PathData& path, bool isEvenOdd, const Paint& paint) {
-    setFill(paint);
-    setNoStroke();
-    drawShape(path, isEvenOdd, PAINTMODE_FILL);
+    flush();
+    wait(path, isEvenOdd, /*isText=*/false, paint);
+}
+
+void Canvas::fillText(const PathData& path, const Paint& paint) {
+    const bool joins = waiting.isText && !waiting.path.isEmpty() && waiting.paint == paint &&
+                       !paint.color.hasAlpha() && waiting.path.points.size() < maxTextPoints &&
+                       effects == Effects();
+    if (joins) {
+        waiting.path.append(path);
+        return;
+    }
+    flush();
+    wait(path, /*isEvenOdd=*/false, /*isText=*/true, paint);
+}
+
+void Canvas::wait(const PathData& path, bool isEvenOdd, bool isText, const Paint& paint) {
+    waiting.path = path;
+    waiting.isEvenOdd = isEvenOdd;
+    waiting.isText = isText;
+    waiting.paint = paint;
+}
+
+void Canvas::flush() {
+    if (waiting.path.isEmpty()) {
+        return;
+    }
+    settings.setFill(waiting.paint);
+    settings.setNoStroke();
+    drawShape(waiting.path, waiting.isEvenOdd, PAINTMODE_FILL);
+    waiting.path.clear();
 }
 
 void Canvas::stroke(const PathData& path, const Paint& paint, const Pen& pen) {
-    setNoFill();
-    setStroke(paint, pen);
-    if (path.isLine()) {
-        const fz_point& from = path.points[0];
-        const fz_point& to = path.points[1];
-        out.drawLine(pt(from.x), pt(from.y), pt(to.x), pt(to.y), PAINTMODE_STROKE);
+    if (!waiting.path.isEmpty() && waiting.path == path) {
+        strokeWaiting(paint, pen);
         return;
     }
-    drawShape(path, true, PAINTMODE_STROKE);
+    flush();
+    settings.setNoFill();
+    settings.setStroke(paint, pen);
+    if (!path.isLine()) {
+        drawShape(path, /*isEvenOdd=*/true, PAINTMODE_STROKE);
+        return;
+    }
+    const fz_point& from = path.points[0];
+    const fz_point& to = path.points[1];
+    out.drawLine(pt(from.x), pt(from.y), pt(to.x), pt(to.y), PAINTMODE_STROKE);
 }
 
-void Canvas::fillAndStroke(const PathData& path, bool isEvenOdd, const Paint& inside,
-                           const Paint& outline, const Pen& pen) {
-    setFill(inside);
-    setStroke(outline, pen);
-    drawShape(path, isEvenOdd, PAINTMODE_FILLSTROKE);
-}
-
-void Canvas::fillRectangle(const fz_rect& rect, const Paint& paint) {
-    setFill(paint);
-    setNoStroke();
-    drawRectangle(rect, PAINTMODE_FILL);
+void Canvas::strokeWaiting(const Paint& paint, const Pen& pen) {
+    settings.setFill(waiting.paint);
+    settings.setStroke(paint, pen);
+    drawShape(waiting.path, waiting.isEvenOdd, PAINTMODE_FILLSTROKE);
+    waiting.path.clear();
 }
 
 void Canvas::drawShape(const PathData& path, bool isEvenOdd, PAINTMODE mode) {
+    const bool isStroked = (mode & PAINTMODE_STROKE) != 0;
     fz_rect rect;
     // Dashes begin at the first corner, which a rectangle doesn't keep.
-    if (state.pen.dashCount == 0 && path.isRectangle(rect)) {
-        drawRectangle(rect, mode);
+    if ((!isStroked || !settings.hasDashes()) && path.isRectangle(rect)) {
+        settings.setFillRule(FILLRULE_EVENODD);
+        out.drawRect(pt(rect.x0), pt(rect.y0), pt(rect.x1 - rect.x0), pt(rect.y1 - rect.y0), pt(0),
+                     pt(0), mode);
         return;
     }
-    drawPath(path, isEvenOdd, mode);
+    settings.setFillRule(isEvenOdd ? FILLRULE_EVENODD : FILLRULE_NONZERO);
+    drawPath(path, mode);
 }
 
-void Canvas::drawRectangle(const fz_rect& rect, PAINTMODE mode) {
-    setFillRule(FILLRULE_EVENODD);
-    out.drawRect(pt(rect.x0), pt(rect.y0), pt(rect.x1 - rect.x0), pt(rect.y1 - rect.y0), pt(0),
-                 pt(0), mode);
-}
-
-void Canvas::drawPath(const PathData& path, bool isEvenOdd, PAINTMODE mode) {
-    const auto place = [](const fz_point& point) {
-        return MoxPointT<MoxLength>(pt(point.x), pt(point.y));
-    };
-    const bool fills = (mode & PAINTMODE_FILL) != 0;
-    setFillRule(isEvenOdd || !fills ? FILLRULE_EVENODD : FILLRULE_NONZERO);
+void Canvas::drawPath(const PathData& path, PAINTMODE mode) {
     out.startPathData();
     const fz_point* point = path.points.data();
     for (const PATHSTEP step : path.steps) {
@@ -96,113 +120,86 @@ void Canvas::drawPath(const PathData& path, bool isEvenOdd, PAINTMODE mode) {
     out.endPathData(mode);
 }
 
+void Canvas::setEffects(const Effects& newEffects) {
+    if (effects == newEffects) {
+        return;
+    }
+    flush();
+    effects = newEffects;
+    settings.setOpacity(effects.opacity);
+    settings.setMask(effects.mask);
+}
+
 void Canvas::push() {
+    flush();
     out.pushState();
-    saved.push_back(state);
+    settings.save(/*isDefinition=*/false);
 }
 
 void Canvas::pop() {
+    flush();
     out.popState();
-    leaveDefinition();
-}
-
-void Canvas::enterDefinition() {
-    saved.push_back(state);
-    state = State();
-}
-
-void Canvas::leaveDefinition() {
-    state = std::move(saved.back());
-    saved.pop_back();
+    settings.restore();
 }
 
 void Canvas::transform(const fz_matrix& matrix) { out.setTransMatrix(toMatrix(matrix)); }
 
-void Canvas::setFill(const Paint& paint) {
-    if (state.fill == paint) {
-        return;
-    }
-    state.fill = paint;
-    out.setFillColor(paint.color);
-    if (!paint.id.isEmpty()) {
-        out.setFillColorId(paint.id);
-    }
+void Canvas::beginClip(const PathData& path, bool isEvenOdd) {
+    push();
+    saveDefinition();
+    out.startClipDef(USERSPACEONUSE);
+    out.setClipRuleAttrVal(isEvenOdd ? CLIPRULE_EVENODD : CLIPRULE_NONZERO);
+    drawShape(path, /*isEvenOdd=*/true, PAINTMODE_FILL);
+    out.endClipDef();
+    restoreDefinition();
+    out.doClip();
 }
 
-void Canvas::setStroke(const Paint& paint, const Pen& pen) {
-    if (state.stroke != paint) {
-        state.stroke = paint;
-        out.setStrokeColor(paint.color);
-        if (!paint.id.isEmpty()) {
-            out.setStrokeColorId(paint.id);
-        }
-    }
-    setPen(pen);
+UnicodeString Canvas::beginPattern(const fz_rect& cell, const fz_matrix& matrix) {
+    flush();
+    saveDefinition();
+    return out.startPattern(place(cell), place(cell), toMatrix(matrix), USERSPACEONUSE,
+                            USERSPACEONUSE);
 }
 
-// What does not paint is set back, so that nothing is written about it.
-
-void Canvas::setNoFill() {
-    if (state.fill.color.hasAlpha()) {
-        setFill(Paint());
-    }
+void Canvas::endPattern() {
+    flush();
+    out.endPattern();
+    restoreDefinition();
 }
 
-void Canvas::setNoStroke() {
-    if (isNone(state.stroke)) {
-        return;
-    }
-    state.stroke = {MoxColor(), u"none"};
-    out.setStrokeColor(MoxColor());
-    out.setStrokeColorName(u"none");
-    setPen(Pen());
+UnicodeString Canvas::beginMask(const fz_rect& area) {
+    flush();
+    saveDefinition();
+    return out.startMask(pt(area.x0), pt(area.y0), pt(area.x1 - area.x0), pt(area.y1 - area.y0),
+                         USERSPACEONUSE, USERSPACEONUSE);
 }
 
-void Canvas::setPen(const Pen& pen) {
-    Pen& current = state.pen;
-    if (current == pen) {
-        return;
-    }
-    if (current.width != pen.width) {
-        out.setStrokeWidth(pt(pen.width == 0 ? hairWidth : pen.width));
-    }
-    if (current.cap != pen.cap) {
-        out.setLineCap(pen.cap);
-    }
-    if (current.join != pen.join) {
-        out.setLineJoin(pen.join);
-    }
-    if (current.miterLimit != pen.miterLimit) {
-        out.setMiterLimit(pen.miterLimit);
-    }
-    if (current.dashes != pen.dashes || current.dashCount != pen.dashCount ||
-        current.dashOffset != pen.dashOffset) {
-        std::array<MoxLength, 32> dashes;
-        std::transform(pen.dashes.begin(), pen.dashes.end(), dashes.begin(), pt);
-        out.setDashLine(dashes.data(), pen.dashCount, pt(pen.dashOffset));
-    }
-    current = pen;
+void Canvas::endMask() {
+    flush();
+    out.endMask();
+    restoreDefinition();
 }
 
-void Canvas::setFillRule(int rule) {
-    if (state.fillRule != rule) {
-        state.fillRule = rule;
-        out.setFillRule(static_cast<FILLRULE>(rule));
-    }
+void Canvas::saveDefinition() {
+    settings.save(/*isDefinition=*/true);
+    savedEffects.push_back(std::exchange(effects, Effects()));
 }
 
-void Canvas::setOpacity(float opacity) {
-    if (state.opacity != opacity) {
-        state.opacity = opacity;
-        out.setOpacity(opacity, OPACITYDEST_ELEMENT);
-    }
+void Canvas::restoreDefinition() {
+    settings.restore();
+    effects = std::move(savedEffects.back());
+    savedEffects.pop_back();
 }
 
-void Canvas::setMask(const UnicodeString& id) {
-    if (state.mask != id) {
-        state.mask = id;
-        out.setMaskReference(id);
-    }
+void Canvas::beginLink(const UnicodeString& uri, bool isNewWindow) {
+    flush();
+    out.startLink(uri, isNewWindow ? MoxName(u"new") : MoxName());
+}
+
+void Canvas::endLink() {
+    flush();
+    out.endLink();
 }
 
 } // namespace DrawmereConvert

@@ -33,7 +33,8 @@ bool runPage(DocumentFile& file, PagePainter& painter, const fz_matrix& matrix) 
 } // namespace
 
 DocumentConverter::DocumentConverter(const ConvertOptions& chosen)
-    : options(chosen), file(std::make_unique<DocumentFile>(chosen)) {}
+    : options(chosen), file(std::make_unique<DocumentFile>(chosen)),
+      outlines(std::make_unique<GlyphOutlines>(file->ctx)) {}
 
 DocumentConverter::~DocumentConverter() = default;
 
@@ -52,6 +53,7 @@ void DocumentConverter::findDestinations(PageTargets& targets) {
 }
 
 PageSize DocumentConverter::loadPage(int page) {
+    outlines->trim();
     file->loadPage(page);
     return getSize(file->pageBounds);
 }
@@ -66,7 +68,8 @@ PageReport DocumentConverter::drawPage(const PagePlace& place, const PageTargets
         drawmere.setCanvasSize(pt(size.width), pt(size.height));
     }
     PageReport report;
-    PagePainter painter(file->ctx, options, report, drawmere);
+    PagePainter painter(file->ctx, options, *outlines, report, drawmere,
+                        {0, place.offset, size.width, bottom});
     report.isComplete = runPage(*file, painter, fz_translate(-bounds.x0, place.offset - bounds.y0));
     if (painter.failure) {
         std::rethrow_exception(painter.failure);

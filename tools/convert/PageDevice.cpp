@@ -51,6 +51,37 @@ void strokePath(fz_context* ctx, fz_device* device, const fz_path* path,
     });
 }
 
+void clipPath(fz_context* ctx, fz_device* device, const fz_path* path, int isEvenOdd,
+              fz_matrix matrix, fz_rect /*scissor*/) {
+    paint(ctx, device,
+          [&](PagePainter& painter) { painter.clipPath(path, isEvenOdd != 0, matrix); });
+}
+
+void fillText(fz_context* ctx, fz_device* device, const fz_text* text, fz_matrix matrix,
+              fz_colorspace* space, const float* color, float alpha, fz_color_params params) {
+    paint(ctx, device, [&](PagePainter& painter) {
+        painter.fillText(*text, matrix, {painter.colors.convert(space, color, alpha, params)});
+    });
+}
+
+void strokeText(fz_context* ctx, fz_device* device, const fz_text* text,
+                const fz_stroke_state* stroke, fz_matrix matrix, fz_colorspace* space,
+                const float* color, float alpha, fz_color_params params) {
+    paint(ctx, device, [&](PagePainter& painter) {
+        painter.strokeText(*text, *stroke, matrix,
+                           {painter.colors.convert(space, color, alpha, params)});
+    });
+}
+
+void clipText(fz_context* ctx, fz_device* device, const fz_text* text, fz_matrix matrix,
+              fz_rect /*scissor*/) {
+    paint(ctx, device, [&](PagePainter& painter) { painter.clipText(*text, matrix); });
+}
+
+void popClip(fz_context* ctx, fz_device* device) {
+    paint(ctx, device, [](PagePainter& painter) { painter.popClip(); });
+}
+
 } // namespace
 
 fz_device* makePageDevice(fz_context* ctx, PagePainter* painter) {
@@ -58,6 +89,11 @@ fz_device* makePageDevice(fz_context* ctx, PagePainter* painter) {
     device->painter = painter;
     device->base.fill_path = &fillPath;
     device->base.stroke_path = &strokePath;
+    device->base.clip_path = &clipPath;
+    device->base.fill_text = &fillText;
+    device->base.stroke_text = &strokeText;
+    device->base.clip_text = &clipText;
+    device->base.pop_clip = &popClip;
     return &device->base;
 }
 

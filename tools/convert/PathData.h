@@ -29,6 +29,7 @@ public:
 
     void curveTo(float x1, float y1, float x2, float y2, float x, float y);
     void close();
+    void append(const PathData& other);
 
     /// Drops what draws nothing: moves that no segment follows.
     void tidy();

@@ -1,0 +1,152 @@
+#include "tools/convert/GlyphOutlines.h"
+
+#include "tools/convert/FitzCall.h"
+
+#include <algorithm>
+#include <new>
+
+namespace DrawmereConvert {
+namespace {
+
+constexpr int maxGlyph = 0xFFFF;
+constexpr std::size_t maxKeptPoints = 4'000'000;
+
+/// Takes the segments of an outline as they come, in units of the em.
+struct OutlineReading {
+    std::vector<PATHSTEP>& steps;
+    std::vector<fz_point>& points;
+    bool isOutOfMemory = false;
+
+    void add(PATHSTEP step, std::initializer_list<fz_point> newPoints) noexcept {
+        try {
+            steps.push_back(step);
+            points.insert(points.end(), newPoints);
+        } catch (...) {
+            isOutOfMemory = true;
+        }
+    }
+};
+
+OutlineReading& readingOf(void* arg) { return *static_cast<OutlineReading*>(arg); }
+
+void moveTo(fz_context* /*ctx*/, void* arg, float x, float y) {
+    readingOf(arg).add(PATHSTEP_MOVE, {{x, y}});
+}
+
+void lineTo(fz_context* /*ctx*/, void* arg, float x, float y) {
+    readingOf(arg).add(PATHSTEP_LINE, {{x, y}});
+}
+
+void curveTo(fz_context* /*ctx*/, void* arg, float x1, float y1, float x2, float y2, float x3,
+             float y3) {
+    readingOf(arg).add(PATHSTEP_CURVE, {{x1, y1}, {x2, y2}, {x3, y3}});
+}
+
+void closePath(fz_context* /*ctx*/, void* arg) { readingOf(arg).add(PATHSTEP_CLOSE, {}); }
+
+constexpr fz_path_walker walker = {&moveTo, &lineTo, &curveTo, &closePath,
+                                   nullptr, nullptr, nullptr,  nullptr};
+
+} // namespace
+
+GlyphOutlines::~GlyphOutlines() {
+    for (const auto& font : fonts) {
+        fz_drop_font(ctx, font.first);
+    }
+}
+
+void GlyphOutlines::trim() {
+    std::size_t kept = 0;
+    for (const auto& font : fonts) {
+        kept += font.second->points.size();
+    }
+    if (kept < maxKeptPoints) {
+        return;
+    }
+    for (const auto& font : fonts) {
+        fz_drop_font(ctx, font.first);
+    }
+    fonts.clear();
+    lastFont = nullptr;
+}
+
+GlyphOutlines::FontOutlines& GlyphOutlines::findFont(fz_font* font) {
+    if (font == lastFont) {
+        return *lastOutlines;
+    }
+    std::unique_ptr<FontOutlines>& outlines = fonts[font];
+    if (!outlines) {
+        outlines = std::make_unique<FontOutlines>();
+        fz_keep_font(ctx, font);
+    }
+    lastFont = font;
+    lastOutlines = outlines.get();
+    return *outlines;
+}
+
+GlyphOutline GlyphOutlines::find(fz_font* font, int glyph) {
+    if (glyph < 0 || glyph > maxGlyph) {
+        return {};
+    }
+    FontOutlines& outlines = findFont(font);
+    const auto index = static_cast<std::size_t>(glyph);
+    if (index >= outlines.entries.size()) {
+        outlines.entries.resize(index + 1);
+    }
+    Entry& entry = outlines.entries[index];
+    if (!entry.isRead) {
+        read(font, glyph, outlines, entry);
+    }
+    return {outlines.steps.data() + entry.firstStep, entry.stepCount,
+            outlines.points.data() + entry.firstPoint};
+}
+
+void GlyphOutlines::read(fz_font* font, int glyph, FontOutlines& outlines, Entry& entry) {
+    entry.isRead = true;
+    entry.firstStep = static_cast<std::uint32_t>(outlines.steps.size());
+    entry.firstPoint = static_cast<std::uint32_t>(outlines.points.size());
+    OutlineReading reading{outlines.steps, outlines.points};
+    callFitz(ctx, [&] {
+        fz_path* path = fz_outline_glyph(ctx, font, glyph, fz_identity);
+        if (path) {
+            fz_walk_path(ctx, path, &walker, &reading); // the callbacks never fail
+            fz_drop_path(ctx, path);
+        }
+    });
+    if (reading.isOutOfMemory) {
+        throw std::bad_alloc();
+    }
+    entry.stepCount = static_cast<std::uint32_t>(outlines.steps.size()) - entry.firstStep;
+}
+
+void GlyphOutlines::append(fz_font* font, int glyph, const fz_matrix& matrix, PathData& path) {
+    const GlyphOutline outline = find(font, glyph);
+    const fz_point* point = outline.points;
+    const auto next = [&] { return fz_transform_point(*point++, matrix); };
+    for (const PATHSTEP* step = outline.steps; step != outline.steps + outline.stepCount; ++step) {
+        switch (*step) {
+        case PATHSTEP_MOVE: {
+            const fz_point at = next();
+            path.moveTo(at.x, at.y);
+            break;
+        }
+        case PATHSTEP_LINE: {
+            const fz_point at = next();
+            path.lineTo(at.x, at.y);
+            break;
+        }
+        case PATHSTEP_CURVE: {
+            const fz_point first = next();
+            const fz_point second = next();
+            const fz_point at = next();
+            path.curveTo(first.x, first.y, second.x, second.y, at.x, at.y);
+            break;
+        }
+        case PATHSTEP_CLOSE:
+            path.close();
+            break;
+        }
+    }
+}
+
+} // namespace DrawmereConvert
