@@ -2,9 +2,13 @@
 
 #include "tools/convert/DocumentFile.h"
 #include "tools/convert/GlyphOutlines.h"
+#include "tools/convert/LinkReader.h"
+#include "tools/convert/LinkWriter.h"
 #include "tools/convert/PageDevice.h"
 #include "tools/convert/PagePainter.h"
+#include "tools/convert/TextFont.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace DrawmereConvert {
@@ -34,7 +38,8 @@ bool runPage(DocumentFile& file, PagePainter& painter, const fz_matrix& matrix) 
 
 DocumentConverter::DocumentConverter(const ConvertOptions& chosen)
     : options(chosen), file(std::make_unique<DocumentFile>(chosen)),
-      outlines(std::make_unique<GlyphOutlines>(file->ctx)) {}
+      outlines(std::make_unique<GlyphOutlines>(file->ctx)),
+      fonts(std::make_unique<FontBook>(file->ctx)) {}
 
 DocumentConverter::~DocumentConverter() = default;
 
@@ -44,37 +49,81 @@ void DocumentConverter::open(const std::string& path, const std::string& passwor
 
 int DocumentConverter::getPageCount() const { return file->pageCount; }
 
-std::string DocumentConverter::getTitle() const { return {}; }
+std::string DocumentConverter::getTitle() const {
+    char title[256] = "";
+    fz_context* ctx = file->ctx;
+    fz_document* document = file->document;
+    const bool isKnown = callFitz(
+        ctx, [&] { fz_lookup_metadata(ctx, document, FZ_META_INFO_TITLE, title, sizeof title); });
+    return isKnown ? title : "";
+}
 
-std::vector<OutlineEntry> DocumentConverter::getOutline() const { return {}; }
+std::vector<OutlineEntry> DocumentConverter::getOutline() const {
+    return readOutline(file->ctx, file->document);
+}
 
 void DocumentConverter::findDestinations(PageTargets& targets) {
-    targets.destinations.resize(targets.files.size());
+    targets.destinations.assign(targets.files.size(), {});
+    for (std::size_t page = 0; page < targets.files.size(); ++page) {
+        if (!targets.files[page].isEmpty()) {
+            findDestinationsOf(static_cast<int>(page), targets);
+        }
+    }
+}
+
+void DocumentConverter::findDestinationsOf(int page, PageTargets& targets) {
+    try {
+        file->loadPage(page);
+    } catch (const ConvertError&) {
+        return; // said when it is to be drawn
+    }
+    for (const PageLink& link : readLinks(file->ctx, file->document, file->page)) {
+        const bool isWhole = link.destination.id.isEmpty();
+        if (link.page < 0 || link.page >= static_cast<int>(targets.destinations.size()) ||
+            (isWhole && !targets.singleFile)) {
+            continue;
+        }
+        const LinkDestination destination =
+            isWhole ? makePageDestination(link.page) : link.destination;
+        auto& known = targets.destinations[static_cast<std::size_t>(link.page)];
+        const bool isKnown = std::ranges::any_of(
+            known, [&](const LinkDestination& other) { return other.id == destination.id; });
+        if (!isKnown) {
+            known.push_back(destination);
+        }
+    }
 }
 
 PageSize DocumentConverter::loadPage(int page) {
     outlines->trim();
+    currentPage = page;
     file->loadPage(page);
     return getSize(file->pageBounds);
 }
 
-PageReport DocumentConverter::drawPage(const PagePlace& place, const PageTargets& /*targets*/,
+PageReport DocumentConverter::drawPage(const PagePlace& place, const PageTargets& targets,
                                        Drawmere& drawmere) {
     const fz_rect& bounds = file->pageBounds;
     const PageSize size = getSize(bounds);
     const float bottom = place.offset + size.height;
     drawmere.startPage(place.number, {pt(0), pt(place.offset), pt(size.width), pt(bottom)});
     if (place.isSingle) {
+        fonts->startDocument();
         drawmere.setCanvasSize(pt(size.width), pt(size.height));
     }
     PageReport report;
-    PagePainter painter(file->ctx, options, *outlines, report, drawmere,
-                        {0, place.offset, size.width, bottom});
-    report.isComplete = runPage(*file, painter, fz_translate(-bounds.x0, place.offset - bounds.y0));
+    const fz_matrix matrix = fz_translate(-bounds.x0, place.offset - bounds.y0);
+    PagePainter painter(file->ctx, options, *outlines, *fonts, report, drawmere,
+                        {0, place.offset, size.width, bottom},
+                        [&](GroupScan& scan) { scan.run(file->ctx, file->page, matrix); });
+    report.isComplete = runPage(*file, painter, matrix);
     if (painter.failure) {
         std::rethrow_exception(painter.failure);
     }
     painter.finish();
+    LinkWriter links(painter.canvas, targets, currentPage, {-bounds.x0, place.offset - bounds.y0});
+    links.writeLinks(readLinks(file->ctx, file->document, file->page));
+    links.writeDestinations();
     drawmere.endPage();
     report.isComplete = report.isComplete && file->cookie.errors == 0;
     report.messages = std::exchange(file->messages, {});

@@ -4,6 +4,7 @@
 #include "Drawmere.h"
 #include "tools/convert/ConvertError.h"
 #include "tools/convert/ConvertOptions.h"
+#include "tools/convert/OutlineEntry.h"
 #include "tools/convert/PageReport.h"
 #include "tools/convert/PageTargets.h"
 
@@ -16,6 +17,7 @@ namespace DrawmereConvert {
 using DrawmereNS::Drawmere;
 
 class DocumentFile;
+class FontBook;
 class GlyphOutlines;
 
 /// The size of a page. Units: points.
@@ -29,13 +31,6 @@ struct PagePlace {
     int number = 1;       ///< handed to `Drawmere::startPage`, so it counts in file names
     float offset = 0;     ///< how far down the page begins in its document, in points
     bool isSingle = true; ///< the page is all of its document, so it sets the size of the canvas
-};
-
-/// An entry of the document's outline, in document order.
-struct OutlineEntry {
-    std::string title; ///< UTF-8
-    int page = -1;     ///< from 0; -1 for an entry that leads to no page
-    int level = 0;
 };
 
 /// One document. For each page: `loadPage`, then `Drawmere::initRootSvg`, `drawPage` and
@@ -80,9 +75,13 @@ public:
     void cancel();
 
 private:
+    void findDestinationsOf(int page, PageTargets& targets);
+
     ConvertOptions options;
     std::unique_ptr<DocumentFile> file;
+    int currentPage = 0;                     // the one loaded last
     std::unique_ptr<GlyphOutlines> outlines; // kept from page to page
+    std::unique_ptr<FontBook> fonts;         // likewise
 };
 
 } // namespace DrawmereConvert

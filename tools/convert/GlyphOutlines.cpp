@@ -58,7 +58,7 @@ GlyphOutlines::~GlyphOutlines() {
 void GlyphOutlines::trim() {
     std::size_t kept = 0;
     for (const auto& font : fonts) {
-        kept += font.second->points.size();
+        kept += font.second->data.points.size();
     }
     if (kept < maxKeptPoints) {
         return;
@@ -97,15 +97,24 @@ GlyphOutline GlyphOutlines::find(fz_font* font, int glyph) {
     if (!entry.isRead) {
         read(font, glyph, outlines, entry);
     }
-    return {outlines.steps.data() + entry.firstStep, entry.stepCount,
-            outlines.points.data() + entry.firstPoint};
+    return {outlines.data.steps.data() + entry.firstStep, entry.stepCount,
+            outlines.data.points.data() + entry.firstPoint, entry.isDrawing};
 }
 
 void GlyphOutlines::read(fz_font* font, int glyph, FontOutlines& outlines, Entry& entry) {
     entry.isRead = true;
-    entry.firstStep = static_cast<std::uint32_t>(outlines.steps.size());
-    entry.firstPoint = static_cast<std::uint32_t>(outlines.points.size());
-    OutlineReading reading{outlines.steps, outlines.points};
+    entry.firstStep = static_cast<std::uint32_t>(outlines.data.steps.size());
+    entry.firstPoint = static_cast<std::uint32_t>(outlines.data.points.size());
+    if (fz_font_t3_procs(ctx, font)) {
+        entry.isDrawing = !readType3Outline(ctx, font, glyph, outlines.data);
+    } else {
+        readFile(font, glyph, outlines.data);
+    }
+    entry.stepCount = static_cast<std::uint32_t>(outlines.data.steps.size()) - entry.firstStep;
+}
+
+void GlyphOutlines::readFile(fz_font* font, int glyph, LooseOutline& data) {
+    OutlineReading reading{data.steps, data.points};
     callFitz(ctx, [&] {
         fz_path* path = fz_outline_glyph(ctx, font, glyph, fz_identity);
         if (path) {
@@ -116,10 +125,9 @@ void GlyphOutlines::read(fz_font* font, int glyph, FontOutlines& outlines, Entry
     if (reading.isOutOfMemory) {
         throw std::bad_alloc();
     }
-    entry.stepCount = static_cast<std::uint32_t>(outlines.steps.size()) - entry.firstStep;
 }
 
-void GlyphOutlines::append(fz_font* font, int glyph, const fz_matrix& matrix, PathData& path) {
+bool GlyphOutlines::append(fz_font* font, int glyph, const fz_matrix& matrix, PathData& path) {
     const GlyphOutline outline = find(font, glyph);
     const fz_point* point = outline.points;
     const auto next = [&] { return fz_transform_point(*point++, matrix); };
@@ -147,6 +155,7 @@ void GlyphOutlines::append(fz_font* font, int glyph, const fz_matrix& matrix, Pa
             break;
         }
     }
+    return !outline.isDrawing;
 }
 
 } // namespace DrawmereConvert

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "tools/convert/PathData.h"
+#include "tools/convert/Type3Outline.h"
 
 #include <mupdf/fitz.h>
 
@@ -17,6 +18,7 @@ struct GlyphOutline {
     const PATHSTEP* steps = nullptr;
     std::size_t stepCount = 0;
     const fz_point* points = nullptr;
+    bool isDrawing = false; ///< it has no outline, as a Type 3 font draws it in other ways
 };
 
 /// Reads outlines from fonts and keeps them, and the fonts, until `trim`.
@@ -33,7 +35,8 @@ public:
     GlyphOutline find(fz_font* font, int glyph);
 
     /// Appends the outline of a glyph, with `matrix` applied, to `path`.
-    void append(fz_font* font, int glyph, const fz_matrix& matrix, PathData& path);
+    /// Returns: false for a glyph that is a drawing.
+    bool append(fz_font* font, int glyph, const fz_matrix& matrix, PathData& path);
 
     /// Forgets everything when it has become too much to keep; to be called between pages.
     void trim();
@@ -44,16 +47,17 @@ private:
         std::uint32_t stepCount = 0;
         std::uint32_t firstPoint = 0;
         bool isRead = false;
+        bool isDrawing = false;
     };
 
     struct FontOutlines {
         std::vector<Entry> entries; // by glyph
-        std::vector<PATHSTEP> steps;
-        std::vector<fz_point> points;
+        LooseOutline data;
     };
 
     FontOutlines& findFont(fz_font* font);
     void read(fz_font* font, int glyph, FontOutlines& outlines, Entry& entry);
+    void readFile(fz_font* font, int glyph, LooseOutline& data);
 
     fz_context* ctx;
     std::unordered_map<fz_font*, std::unique_ptr<FontOutlines>> fonts; // the fonts are kept

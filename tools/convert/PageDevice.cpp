@@ -1,5 +1,7 @@
 #include "tools/convert/PageDevice.h"
 
+#include <utility>
+
 namespace DrawmereConvert {
 namespace {
 
@@ -73,13 +75,87 @@ void strokeText(fz_context* ctx, fz_device* device, const fz_text* text,
     });
 }
 
+void ignoreText(fz_context* ctx, fz_device* device, const fz_text* text, fz_matrix matrix) {
+    paint(ctx, device, [&](PagePainter& painter) { painter.ignoreText(*text, matrix); });
+}
+
 void clipText(fz_context* ctx, fz_device* device, const fz_text* text, fz_matrix matrix,
               fz_rect /*scissor*/) {
     paint(ctx, device, [&](PagePainter& painter) { painter.clipText(*text, matrix); });
 }
 
+void clipStrokePath(fz_context* ctx, fz_device* device, const fz_path* path,
+                    const fz_stroke_state* stroke, fz_matrix matrix, fz_rect /*scissor*/) {
+    paint(ctx, device,
+          [&](PagePainter& painter) { painter.clipStrokePath(path, *stroke, matrix); });
+}
+
+void clipStrokeText(fz_context* ctx, fz_device* device, const fz_text* text,
+                    const fz_stroke_state* stroke, fz_matrix matrix, fz_rect /*scissor*/) {
+    paint(ctx, device,
+          [&](PagePainter& painter) { painter.clipStrokeText(*text, *stroke, matrix); });
+}
+
+void fillShade(fz_context* ctx, fz_device* device, fz_shade* shade, fz_matrix matrix, float alpha,
+               fz_color_params /*params*/) {
+    paint(ctx, device, [&](PagePainter& painter) { painter.fillShade(shade, matrix, alpha); });
+}
+
+void fillImage(fz_context* ctx, fz_device* device, fz_image* image, fz_matrix matrix, float alpha,
+               fz_color_params /*params*/) {
+    paint(ctx, device, [&](PagePainter& painter) { painter.fillImage(image, matrix, alpha); });
+}
+
+void fillImageMask(fz_context* ctx, fz_device* device, fz_image* image, fz_matrix matrix,
+                   fz_colorspace* space, const float* color, float alpha, fz_color_params params) {
+    paint(ctx, device, [&](PagePainter& painter) {
+        painter.fillImageMask(image, matrix, {painter.colors.convert(space, color, alpha, params)});
+    });
+}
+
+void clipImageMask(fz_context* ctx, fz_device* device, fz_image* image, fz_matrix matrix,
+                   fz_rect /*scissor*/) {
+    paint(ctx, device, [&](PagePainter& painter) { painter.clipImageMask(image, matrix); });
+}
+
 void popClip(fz_context* ctx, fz_device* device) {
     paint(ctx, device, [](PagePainter& painter) { painter.popClip(); });
+}
+
+void beginMask(fz_context* ctx, fz_device* device, fz_rect area, int luminosity,
+               fz_colorspace* space, const float* backdrop, fz_color_params params) {
+    paint(ctx, device, [&](PagePainter& painter) {
+        const COLORUSE use = std::exchange(painter.colors.use, COLORUSE_LUMINOSITY);
+        const MoxColor color =
+            backdrop && space ? painter.colors.convert(space, backdrop, 1, params) : MoxColor();
+        painter.colors.use = use;
+        painter.beginMask(area, luminosity != 0, color == MoxColor() ? nullptr : &color);
+    });
+}
+
+void endMask(fz_context* ctx, fz_device* device) {
+    paint(ctx, device, [](PagePainter& painter) { painter.endMask(); });
+}
+
+void beginGroup(fz_context* ctx, fz_device* device, fz_rect area, fz_colorspace* /*space*/,
+                int /*isolated*/, int knockout, int blendMode, float alpha) {
+    paint(ctx, device,
+          [&](PagePainter& painter) { painter.beginGroup(area, knockout != 0, blendMode, alpha); });
+}
+
+void endGroup(fz_context* ctx, fz_device* device) {
+    paint(ctx, device, [](PagePainter& painter) { painter.endGroup(); });
+}
+
+int beginTile(fz_context* ctx, fz_device* device, fz_rect area, fz_rect view, float xStep,
+              float yStep, fz_matrix matrix, int /*id*/) {
+    paint(ctx, device,
+          [&](PagePainter& painter) { painter.beginTile(area, view, xStep, yStep, matrix); });
+    return 0; // the content is wanted each time, as its colours may differ
+}
+
+void endTile(fz_context* ctx, fz_device* device) {
+    paint(ctx, device, [](PagePainter& painter) { painter.endTile(); });
 }
 
 } // namespace
@@ -87,14 +163,29 @@ void popClip(fz_context* ctx, fz_device* device) {
 fz_device* makePageDevice(fz_context* ctx, PagePainter* painter) {
     PageDevice* device = fz_new_derived_device(ctx, PageDevice);
     device->painter = painter;
-    device->base.fill_path = &fillPath;
-    device->base.stroke_path = &strokePath;
-    device->base.clip_path = &clipPath;
-    device->base.fill_text = &fillText;
-    device->base.stroke_text = &strokeText;
-    device->base.clip_text = &clipText;
-    device->base.pop_clip = &popClip;
-    return &device->base;
+    painter->device = &device->base;
+    fz_device& base = device->base;
+    base.fill_path = &fillPath;
+    base.stroke_path = &strokePath;
+    base.clip_path = &clipPath;
+    base.clip_stroke_path = &clipStrokePath;
+    base.fill_text = &fillText;
+    base.stroke_text = &strokeText;
+    base.clip_text = &clipText;
+    base.ignore_text = &ignoreText;
+    base.clip_stroke_text = &clipStrokeText;
+    base.fill_shade = &fillShade;
+    base.fill_image = &fillImage;
+    base.fill_image_mask = &fillImageMask;
+    base.clip_image_mask = &clipImageMask;
+    base.pop_clip = &popClip;
+    base.begin_mask = &beginMask;
+    base.end_mask = &endMask;
+    base.begin_group = &beginGroup;
+    base.end_group = &endGroup;
+    base.begin_tile = &beginTile;
+    base.end_tile = &endTile;
+    return &base;
 }
 
 } // namespace DrawmereConvert

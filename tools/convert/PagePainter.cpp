@@ -1,38 +1,56 @@
 #include "tools/convert/PagePainter.h"
 
-#include "tools/convert/OutlineText.h"
+#include "tools/convert/BitmapTracer.h"
+#include "tools/convert/FitzCall.h"
 #include "tools/convert/PathReader.h"
+
+#include <algorithm>
+#include <cmath>
+#include <optional>
+#include <utility>
 
 namespace DrawmereConvert {
 namespace {
 
-constexpr int ownDepth = 8; // of elements around and inside the containers of clips
+int toByte(float part) {
+    return static_cast<int>(std::lround(std::clamp(part, 0.0F, 1.0F) * 255.0F));
+}
 
-fz_rect getBounds(const PathData& path, const fz_matrix& matrix, float reach) {
-    return fz_transform_rect(fz_expand_rect(path.getBounds(), reach), matrix);
+fz_rect intersect(const fz_rect& one, const fz_rect& other) {
+    return {std::max(one.x0, other.x0), std::max(one.y0, other.y0), std::min(one.x1, other.x1),
+            std::min(one.y1, other.y1)};
 }
 
 } // namespace
 
 PagePainter::PagePainter(fz_context* context, const ConvertOptions& chosen,
-                         GlyphOutlines& glyphOutlines, PageReport& pageReport, Drawmere& drawmere,
-                         const fz_rect& area)
-    : colors(context), ctx(context), report(pageReport), options(chosen), outlines(glyphOutlines),
-      canvas(drawmere), clips(canvas, report, area, chosen.maxDepth - ownDepth) {}
+                         GlyphOutlines& glyphOutlines, FontBook& fontBook, PageReport& pageReport,
+                         Drawmere& drawmere, const fz_rect& area,
+                         const std::function<void(GroupScan&)>& scanPage)
+    : canvas(drawmere), colors(context), ctx(context), report(pageReport), options(chosen),
+      outlines(glyphOutlines), fonts(fontBook), texts(canvas, chosen.textMode),
+      images(context, chosen, canvas, report), shadings(context, canvas, colors),
+      layers(canvas, colors, images, report, area, chosen.maxDepth, scanPage) {}
+
+// Paths.
 
 void PagePainter::fillPath(const fz_path* path, bool isEvenOdd, const fz_matrix& matrix,
                            const Paint& paint) {
     current.clear();
-    readPath(ctx, path, matrix, current);
-    if (!current.isEmpty() && clips.enter(current.getBounds())) {
+    readPath(ctx, path, layers.place(matrix), current);
+    if (!current.isEmpty() && layers.enter(current.getBounds())) {
         canvas.fill(current, isEvenOdd, paint);
     }
 }
 
+StrokeMatrices PagePainter::startStroke(const fz_matrix& matrix) {
+    current.clear();
+    return splitMatrix(layers.place(matrix));
+}
+
 void PagePainter::strokePath(const fz_path* path, const fz_stroke_state& style,
                              const fz_matrix& matrix, const Paint& paint) {
-    const StrokeMatrices matrices = splitMatrix(matrix);
-    current.clear();
+    const StrokeMatrices matrices = startStroke(matrix);
     readPath(ctx, path, matrices.points, current);
     stroke(style, matrices, paint);
 }
@@ -40,7 +58,8 @@ void PagePainter::strokePath(const fz_path* path, const fz_stroke_state& style,
 void PagePainter::stroke(const fz_stroke_state& style, const StrokeMatrices& matrices,
                          const Paint& paint) {
     const Pen pen = toPen(style, matrices.penScale);
-    if (current.isEmpty() || !clips.enter(getBounds(current, matrices.document, getReach(pen)))) {
+    const fz_rect bounds = fz_expand_rect(current.getBounds(), getReach(pen));
+    if (current.isEmpty() || !layers.enter(fz_transform_rect(bounds, matrices.document))) {
         return;
     }
     if (matrices.isPlain) {
@@ -55,37 +74,225 @@ void PagePainter::stroke(const fz_stroke_state& style, const StrokeMatrices& mat
 
 void PagePainter::clipPath(const fz_path* path, bool isEvenOdd, const fz_matrix& matrix) {
     current.clear();
-    readPath(ctx, path, matrix, current);
-    clips.push(current, isEvenOdd);
+    readPath(ctx, path, layers.place(matrix), current);
+    layers.pushClip(current, isEvenOdd);
 }
 
-void PagePainter::popClip() { clips.pop(); }
+void PagePainter::clipStrokePath(const fz_path* path, const fz_stroke_state& style,
+                                 const fz_matrix& matrix) {
+    const StrokeMatrices matrices = startStroke(matrix);
+    readPath(ctx, path, matrices.points, current);
+    layers.pushStrokeClip({current, matrices, toPen(style, matrices.penScale)});
+}
+
+// Text.
 
 void PagePainter::fillText(const fz_text& text, const fz_matrix& matrix, const Paint& paint) {
+    if (options.textMode != TEXTMODE_OUTLINES) {
+        writeText(text, matrix, {PAINTMODE_FILL, paint});
+        return;
+    }
     current.clear();
-    readOutlines(outlines, text, matrix, current);
-    if (!current.isEmpty() && clips.enter(current.getBounds())) {
+    const std::vector<DrawnGlyph> drawn =
+        readOutlines(outlines, text, layers.place(matrix), current);
+    if (!current.isEmpty() && layers.enter(current.getBounds())) {
         canvas.fillText(current, paint);
     }
+    drawGlyphs(drawn, matrix, paint);
+}
+
+void PagePainter::writeText(const fz_text& text, const fz_matrix& matrix, const TextPaint& paint) {
+    for (const fz_text_span* span = text.head; span; span = span->next) {
+        if (writeSpan(*span, matrix, paint)) {
+            continue;
+        }
+        current.clear();
+        std::vector<DrawnGlyph> drawn;
+        readOutlines(outlines, *span, layers.place(matrix), current, drawn);
+        current.tidy();
+        if (!current.isEmpty() && layers.enter(current.getBounds())) {
+            canvas.fillText(current, paint.fill);
+        }
+        drawGlyphs(drawn, matrix, paint.fill);
+    }
+}
+
+bool PagePainter::writeSpan(const fz_text_span& span, const fz_matrix& matrix,
+                            const TextPaint& paint) {
+    if (fz_font_t3_procs(ctx, span.font)) {
+        return paint.mode == PAINTMODE_NONE;
+    }
+    TextFont& font = fonts.find(span.font);
+    const bool embeds = options.textMode == TEXTMODE_FONTS && paint.mode != PAINTMODE_NONE;
+    if (embeds && !font.canEmbed()) {
+        report.note(APPROXIMATION_TEXT);
+        return false;
+    }
+    const TextSpan text(span, layers.place(matrix), font);
+    if (!text.isEmpty() && layers.enter(text.getBounds())) {
+        texts.write(text, paint);
+    }
+    return true;
+}
+
+// Text that doesn't show can still be searched for, if it is text.
+void PagePainter::ignoreText(const fz_text& text, const fz_matrix& matrix) {
+    if (options.textMode != TEXTMODE_OUTLINES) {
+        writeText(text, matrix, {PAINTMODE_NONE});
+    }
+}
+
+// A glyph without colours of its own has those of the text.
+void PagePainter::drawGlyphs(const std::vector<DrawnGlyph>& glyphs, const fz_matrix& matrix,
+                             const Paint& paint) {
+    const bool wasReplaying = std::exchange(layers.isReplaying, true);
+    const std::optional<MoxColor> before = colors.forced;
+    for (const DrawnGlyph& drawn : glyphs) {
+        if (drawn.glyph > 255) {
+            continue;
+        }
+        const bool isColored = (drawn.font->t3flags[drawn.glyph] & FZ_DEVFLAG_MASK) == 0;
+        if (!isColored) {
+            colors.forced = paint.color;
+        }
+        const fz_matrix placed = fz_concat(drawn.matrix, matrix);
+        callFitz(ctx, [&] { fz_run_t3_glyph(ctx, drawn.font, drawn.glyph, placed, device); });
+        colors.forced = before;
+    }
+    layers.isReplaying = wasReplaying;
 }
 
 void PagePainter::strokeText(const fz_text& text, const fz_stroke_state& style,
                              const fz_matrix& matrix, const Paint& paint) {
-    const StrokeMatrices matrices = splitMatrix(matrix);
-    current.clear();
+    const StrokeMatrices matrices = startStroke(matrix);
+    // A pen that becomes an ellipse is for outlines alone.
+    if (options.textMode != TEXTMODE_OUTLINES && matrices.isPlain) {
+        writeText(text, matrix, {PAINTMODE_STROKE, {}, paint, toPen(style, matrices.penScale)});
+        return;
+    }
     readOutlines(outlines, text, matrices.points, current);
     stroke(style, matrices, paint);
 }
 
 void PagePainter::clipText(const fz_text& text, const fz_matrix& matrix) {
     current.clear();
-    readOutlines(outlines, text, matrix, current);
-    clips.push(current, /*isEvenOdd=*/false);
+    readOutlines(outlines, text, layers.place(matrix), current);
+    layers.pushClip(current, /*isEvenOdd=*/false);
 }
 
-void PagePainter::finish() {
-    clips.leave();
-    canvas.flush();
+void PagePainter::clipStrokeText(const fz_text& text, const fz_stroke_state& style,
+                                 const fz_matrix& matrix) {
+    const StrokeMatrices matrices = startStroke(matrix);
+    readOutlines(outlines, text, matrices.points, current);
+    layers.pushStrokeClip({current, matrices, toPen(style, matrices.penScale)});
+}
+
+// Shadings and images.
+
+void PagePainter::fillShade(fz_shade* shade, const fz_matrix& matrix, float alpha) {
+    const fz_matrix placed = layers.place(matrix);
+    const fz_rect area = intersect(fz_bound_shade(ctx, shade, placed), layers.getVisible());
+    if (!(area.x1 > area.x0 && area.y1 > area.y0)) {
+        return;
+    }
+    fillBackground(*shade, area, alpha);
+    const UnicodeString id = shadings.define(shade, placed);
+    if (!id.isEmpty()) {
+        layers.fillClip(area, {MoxColor(0, 0, 0, toByte(alpha)), id});
+        return;
+    }
+    if (!layers.enter(area)) {
+        return;
+    }
+    report.note(APPROXIMATION_SHADING);
+    const ShadingImage image = shadings.draw(shade, placed, area, options.shadeDpi);
+    if (image.pixels) {
+        images.drawPixels(*image.pixels, image.matrix, alpha, colors.use);
+    }
+}
+
+void PagePainter::fillBackground(const fz_shade& shade, const fz_rect& area, float alpha) {
+    const bool covers =
+        shade.type == FZ_LINEAR && shade.u.l_or_r.extend[0] != 0 && shade.u.l_or_r.extend[1] != 0;
+    if (shade.use_background != 0 && !covers) {
+        layers.fillClip(area, {colors.convert(shade.colorspace, shade.background, alpha,
+                                              fz_default_color_params)});
+    }
+}
+
+void PagePainter::fillImage(fz_image* image, const fz_matrix& matrix, float alpha) {
+    const fz_matrix placed = layers.place(matrix);
+    fz_image* mask = layers.findMaskOf(placed);
+    const fz_rect bounds = fz_transform_rect(fz_unit_rect, placed);
+    const bool shows = mask ? layers.enterMasked(bounds) : layers.enter(bounds);
+    if (shows) {
+        images.draw(image, mask, placed, alpha * canvas.getEffects().opacity, colors.use);
+    }
+}
+
+void PagePainter::fillImageMask(fz_image* image, const fz_matrix& matrix, const Paint& paint) {
+    const fz_matrix placed = layers.place(matrix);
+    if (!layers.enter(fz_transform_rect(fz_unit_rect, placed))) {
+        return;
+    }
+    if (traceMask(image, placed)) {
+        canvas.fill(current, /*isEvenOdd=*/false, paint);
+    } else {
+        images.drawStencil(image, placed, paint.color);
+    }
+}
+
+// A small mask is smaller and sharper as a path.
+bool PagePainter::traceMask(fz_image* image, const fz_matrix& matrix) {
+    constexpr std::int64_t maxPixels = 16384;
+    constexpr std::size_t maxCorners = 2000;
+    current.clear();
+    if (!image->imagemask || std::int64_t{image->w} * image->h > maxPixels) {
+        return false;
+    }
+    const ImagePixels pixels(ctx, image);
+    if (pixels.isEmpty()) {
+        return false;
+    }
+    for (const BitmapLoop& loop : traceBitmap(pixels, maxCorners)) {
+        for (const fz_point& corner : loop) {
+            const fz_point point = fz_transform_point(corner, matrix);
+            if (&corner == &loop.front()) {
+                current.moveTo(point.x, point.y);
+            } else {
+                current.lineTo(point.x, point.y);
+            }
+        }
+        current.close();
+    }
+    return !current.isEmpty();
+}
+
+void PagePainter::clipImageMask(fz_image* image, const fz_matrix& matrix) {
+    layers.pushImageMask(image, layers.place(matrix));
+}
+
+// Groups.
+
+void PagePainter::beginMask(const fz_rect& area, bool isLuminosity, const MoxColor* backdrop) {
+    const bool hasBackdrop = isLuminosity && backdrop;
+    layers.beginMask(layers.placeArea(area), isLuminosity,
+                     hasBackdrop ? std::optional<MoxColor>(*backdrop) : std::nullopt);
+}
+
+void PagePainter::beginGroup(const fz_rect& area, bool isKnockout, int blendMode, float alpha) {
+    if (blendMode != FZ_BLEND_NORMAL) {
+        report.note(APPROXIMATION_BLEND);
+    }
+    if (isKnockout) {
+        report.note(APPROXIMATION_KNOCKOUT);
+    }
+    layers.beginGroup(layers.placeArea(area), alpha);
+}
+
+void PagePainter::beginTile(const fz_rect& area, const fz_rect& cell, float xStep, float yStep,
+                            const fz_matrix& matrix) {
+    layers.beginTile(area, cell, xStep, yStep, matrix);
 }
 
 } // namespace DrawmereConvert

@@ -2,54 +2,98 @@
 #pragma once
 
 #include "tools/convert/Canvas.h"
-#include "tools/convert/ClipStack.h"
 #include "tools/convert/ConvertOptions.h"
 #include "tools/convert/GlyphOutlines.h"
+#include "tools/convert/ImageWriter.h"
+#include "tools/convert/Layers.h"
+#include "tools/convert/OutlineText.h"
 #include "tools/convert/PageReport.h"
 #include "tools/convert/PaintColors.h"
-#include "tools/convert/Strokes.h"
+#include "tools/convert/ShadingWriter.h"
+#include "tools/convert/TextFont.h"
+#include "tools/convert/TextWriter.h"
 
 #include <mupdf/fitz.h>
 
 #include <exception>
+#include <functional>
+#include <vector>
 
 namespace DrawmereConvert {
 
 /// One page on its way into the open document. Its operations are the callbacks of a device of
-/// MuPDF; matrices lead to the document's coordinates. They throw; `PageDevice` keeps that from
-/// MuPDF.
+/// MuPDF; matrices and areas are in the document's coordinates. They throw; `PageDevice` keeps that
+/// from MuPDF.
 class PagePainter {
 public:
-    /// Shape: `area`, where the page is in the document.
+    /// Shape: `area`, where the page is in the document; `scanPage` looks ahead at it.
     PagePainter(fz_context* context, const ConvertOptions& chosen, GlyphOutlines& glyphOutlines,
-                PageReport& pageReport, Drawmere& drawmere, const fz_rect& area);
+                FontBook& fontBook, PageReport& pageReport, Drawmere& drawmere, const fz_rect& area,
+                const std::function<void(GroupScan&)>& scanPage);
 
     void fillPath(const fz_path* path, bool isEvenOdd, const fz_matrix& matrix, const Paint& paint);
     void strokePath(const fz_path* path, const fz_stroke_state& style, const fz_matrix& matrix,
                     const Paint& paint);
     void clipPath(const fz_path* path, bool isEvenOdd, const fz_matrix& matrix);
-    void popClip();
+    void clipStrokePath(const fz_path* path, const fz_stroke_state& style, const fz_matrix& matrix);
 
     void fillText(const fz_text& text, const fz_matrix& matrix, const Paint& paint);
     void strokeText(const fz_text& text, const fz_stroke_state& style, const fz_matrix& matrix,
                     const Paint& paint);
+    void ignoreText(const fz_text& text, const fz_matrix& matrix);
     void clipText(const fz_text& text, const fz_matrix& matrix);
+    void clipStrokeText(const fz_text& text, const fz_stroke_state& style, const fz_matrix& matrix);
+
+    void fillShade(fz_shade* shade, const fz_matrix& matrix, float alpha);
+    void fillImage(fz_image* image, const fz_matrix& matrix, float alpha);
+    void fillImageMask(fz_image* image, const fz_matrix& matrix, const Paint& paint);
+    void clipImageMask(fz_image* image, const fz_matrix& matrix);
+
+    void popClip() { layers.pop(); }
+
+    void beginMask(const fz_rect& area, bool isLuminosity, const MoxColor* backdrop);
+
+    void endMask() { layers.endMask(); }
+
+    void beginGroup(const fz_rect& area, bool isKnockout, int blendMode, float alpha);
+
+    void endGroup() { layers.pop(); }
+
+    void beginTile(const fz_rect& area, const fz_rect& cell, float xStep, float yStep,
+                   const fz_matrix& matrix);
+
+    void endTile() { layers.endTile(); }
 
     /// Draws what waits; to be called at the end of the page.
-    void finish();
+    void finish() { layers.finish(); }
 
+    Canvas canvas;
     PaintColors colors;
-    std::exception_ptr failure; ///< what ended the drawing, null as long as all is well
+    fz_device* device = nullptr; ///< that hands on to this object; borrowed
+    std::exception_ptr failure;  ///< what ended the drawing, null as long as all is well
 
 private:
+    /// Splits `matrix` between the document and `current`, which is cleared.
+    StrokeMatrices startStroke(const fz_matrix& matrix);
     void stroke(const fz_stroke_state& style, const StrokeMatrices& matrices, const Paint& paint);
+    /// Writes what the mode of text lets be text. Returns: false for a span that is to be drawn.
+    bool writeSpan(const fz_text_span& span, const fz_matrix& matrix, const TextPaint& paint);
+    void writeText(const fz_text& text, const fz_matrix& matrix, const TextPaint& paint);
+    void drawGlyphs(const std::vector<DrawnGlyph>& glyphs, const fz_matrix& matrix,
+                    const Paint& paint);
+    /// Puts the outline of a small mask into `current`. Returns: false for one that has none.
+    bool traceMask(fz_image* image, const fz_matrix& matrix);
+    void fillBackground(const fz_shade& shade, const fz_rect& area, float alpha);
 
     fz_context* ctx;
     PageReport& report;
     const ConvertOptions& options;
     GlyphOutlines& outlines;
-    Canvas canvas;
-    ClipStack clips;
+    FontBook& fonts;
+    TextWriter texts;
+    ImageWriter images;
+    ShadingWriter shadings;
+    Layers layers;
     PathData current; // kept for its memory
 };
 

@@ -23,6 +23,9 @@ bool PaintColors::isLast(fz_colorspace* space, const float* numbers, int count) 
 
 MoxColor PaintColors::convert(fz_colorspace* space, const float* numbers, float alpha,
                               const fz_color_params& params) {
+    if (forced) {
+        return *forced;
+    }
     if (!space) {
         space = fz_device_gray(ctx);
     }

@@ -6,6 +6,7 @@
 #include <mupdf/fitz.h>
 
 #include <array>
+#include <optional>
 
 namespace DrawmereConvert {
 
@@ -31,6 +32,7 @@ public:
                      const fz_color_params& params);
 
     COLORUSE use = COLORUSE_PICTURE;
+    std::optional<MoxColor> forced; ///< what all colours become
 
 private:
     bool isLast(fz_colorspace* space, const float* numbers, int count) const;

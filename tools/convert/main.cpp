@@ -3,6 +3,7 @@
 #include "tools/convert/DocumentConverter.h"
 
 #include <cstdio>
+#include <cstdlib>
 
 namespace {
 
@@ -30,7 +31,12 @@ bool convertPage(DocumentConverter& converter, int page, const PageTargets& targ
 }
 
 int convert(const char* input, const char* output) {
-    DocumentConverter converter{ConvertOptions()};
+    ConvertOptions options;
+    const char* mode = std::getenv("DRAWMERE_TEXT");
+    options.textMode = !mode || mode[0] == 'o' ? TEXTMODE_OUTLINES
+                       : mode[0] == 'f'        ? TEXTMODE_FONTS
+                                               : TEXTMODE_PLAIN;
+    DocumentConverter converter(options);
     converter.open(input, "");
     SVGConfig config;
     config.streamOutput = false;
@@ -40,7 +46,9 @@ int convert(const char* input, const char* output) {
     SVGPageUri uri(UnicodeString::fromUTF8(output));
     Drawmere drawmere(&config, &uri);
     PageTargets targets;
-    targets.files.resize(converter.getPageCount());
+    for (int page = 0; page < converter.getPageCount(); ++page) {
+        targets.files.push_back(u"p" + UnicodeString::fromUTF8(std::to_string(page + 1)) + u".svg");
+    }
     converter.findDestinations(targets);
     bool isComplete = true;
     for (int page = 0; page < converter.getPageCount(); ++page) {

@@ -1,0 +1,199 @@
+#include "tools/convert/TextFont.h"
+
+#include "tools/convert/FitzCall.h"
+
+#include <ft2build.h>
+#include FT_FREETYPE_H
+#include FT_ADVANCES_H
+
+#include <algorithm>
+#include <cctype>
+
+namespace DrawmereConvert {
+namespace {
+
+using MoxFontService_NS::FS_ExtraFont;
+
+constexpr int regularWeight = 400;
+constexpr int noWeight = 0; // written as nothing, as an embedded font is what it is
+
+FT_Face faceOf(fz_context* ctx, fz_font* font) {
+    return static_cast<FT_Face>(fz_font_ft_face(ctx, font));
+}
+
+/// Drops the mark of a subset: six capitals and a plus.
+std::string dropSubsetMark(const std::string& name) {
+    constexpr std::size_t markLength = 6;
+    const bool isMarked = name.size() > markLength && name[markLength] == '+' &&
+                          std::all_of(name.begin(), name.begin() + markLength,
+                                      [](unsigned char c) { return std::isupper(c) != 0; });
+    return isMarked ? name.substr(markLength + 1) : name;
+}
+
+/// Returns: what of `name` needs no quotes anywhere.
+std::string keepPlain(const std::string& name) {
+    std::string plain;
+    std::ranges::copy_if(name, std::back_inserter(plain),
+                         [](unsigned char c) { return c < 128 && std::isalnum(c) != 0; });
+    const bool isStart = !plain.empty() && std::isalpha(static_cast<unsigned char>(plain[0])) != 0;
+    return isStart ? plain : "F" + plain;
+}
+
+/// Returns: `name` without the style behind a hyphen or comma.
+std::string dropStyle(const std::string& name) { return name.substr(0, name.find_first_of("-,")); }
+
+std::string makeDigest(fz_context* ctx, fz_font* font) {
+    constexpr const char* digits = "0123456789abcdef";
+    constexpr int shownBytes = 3;
+    unsigned char digest[16] = {};
+    callFitz(ctx, [&] { fz_font_digest(ctx, font, digest); });
+    std::string text;
+    for (int i = 0; i < shownBytes; ++i) {
+        text += {digits[digest[i] >> 4U], digits[digest[i] & 15U]};
+    }
+    return text;
+}
+
+const char16_t* findGeneric(fz_context* ctx, fz_font* font) {
+    if (fz_font_is_monospaced(ctx, font)) {
+        return u"monospace";
+    }
+    return fz_font_is_serif(ctx, font) ? u"serif" : u"sans-serif";
+}
+
+void appendFamily(UnicodeString& list, const std::string& family) {
+    UnicodeString text = UnicodeString::fromUTF8(family);
+    text.findAndReplace(u"'", u"");
+    if (text.indexOf(u' ') >= 0) {
+        text = u"'" + text + u"'";
+    }
+    if (!text.isEmpty() && list.indexOf(text) < 0) {
+        list += text + u",";
+    }
+}
+
+} // namespace
+
+TextFont::TextFont(fz_context* context, fz_font* newFont)
+    : ctx(context), font(fz_keep_font(context, newFont)) {
+    readNames();
+}
+
+TextFont::~TextFont() { fz_drop_font(ctx, font); }
+
+void TextFont::readNames() {
+    const std::string own = dropSubsetMark(fz_font_name(ctx, font));
+    name = UnicodeString::fromUTF8(keepPlain(own) + "-" + makeDigest(ctx, font));
+    appendFamily(family, dropStyle(own));
+    const FT_Face face = faceOf(ctx, font);
+    if (face && face->family_name) {
+        appendFamily(family, face->family_name);
+    }
+    family += findGeneric(ctx, font);
+}
+
+bool TextFont::canEmbed() {
+    if (!isTried) {
+        isTried = true;
+        files.push_back(loadFile(name));
+    }
+    return files.front() != nullptr;
+}
+
+UnicodeString TextFont::makeName(int variant) const {
+    return variant == 0 ? name : name + u"-" + UnicodeString::fromUTF8(std::to_string(variant + 1));
+}
+
+std::unique_ptr<FS_ExtraFonts> TextFont::loadFile(const UnicodeString& fileName) const {
+    const FT_Face face = faceOf(ctx, font);
+    // What MuPDF draws fatter or narrower than the file says is no longer the font of the file.
+    if (!face || !font->buffer || font->flags.fake_bold || font->flags.fake_italic) {
+        return nullptr;
+    }
+    unsigned char* data = nullptr;
+    const std::size_t size = fz_buffer_storage(ctx, font->buffer, &data);
+    FS_ExtraFont description;
+    description.names = {fileName};
+    description.weight = regularWeight;
+    description.slant = MoxFontService_NS::FSSLANT_UPRIGHT;
+    description.faceIndex = static_cast<int>(face->face_index & 0xFFFF);
+    auto file = std::make_unique<FS_ExtraFonts>();
+    const bool isRead =
+        file->addBytes(std::string(reinterpret_cast<const char*>(data), size), description);
+    return isRead ? std::move(file) : nullptr;
+}
+
+int TextFont::findVariant(const std::u16string& text, int glyph, int preferred) {
+    const auto fits = [&](std::size_t variant) {
+        return variants[variant].try_emplace(text, glyph).first->second == glyph;
+    };
+    const auto first = static_cast<std::size_t>(preferred);
+    if (first < variants.size() && fits(first)) {
+        return preferred;
+    }
+    std::size_t variant = 0;
+    while (variant < variants.size() && !fits(variant)) {
+        ++variant;
+    }
+    if (variant == variants.size()) {
+        variants.emplace_back()[text] = glyph;
+    }
+    return static_cast<int>(variant);
+}
+
+FS_ExtraFonts* TextFont::describe(int variant, float size, SVGFont& out) {
+    const auto index = static_cast<std::size_t>(variant);
+    while (files.size() <= index) {
+        files.push_back(loadFile(makeName(static_cast<int>(files.size()))));
+    }
+    const UnicodeString fileName = makeName(variant);
+    out.setFontAttribute(fileName, MoxCommonNS::MoxLength::fromRaw(size), noWeight,
+                         DrawmereNS::FSTYLE_NORMAL, UnicodeString(), false);
+    out.setEmbedAttribute(true, true);
+    return files[index].get();
+}
+
+void TextFont::describePlain(float size, SVGFont& out) const {
+    out.setFontAttribute(UnicodeString(), MoxCommonNS::MoxLength::fromRaw(size),
+                         fz_font_is_bold(ctx, font) ? DrawmereNS::FONTWEIGHT_BOLD : noWeight,
+                         fz_font_is_italic(ctx, font) ? DrawmereNS::FSTYLE_ITALIC
+                                                      : DrawmereNS::FSTYLE_NORMAL,
+                         UnicodeString(), true);
+    out.fontFamily = family; // several names, of which only some need quotes
+}
+
+float TextFont::getAdvance(int glyph) {
+    const auto index = static_cast<std::size_t>(glyph);
+    if (index >= advances.size()) {
+        advances.resize(index + 1, -1.0F);
+    }
+    float& advance = advances[index];
+    if (advance < 0) {
+        const FT_Face face = faceOf(ctx, font);
+        FT_Fixed units = 0;
+        const bool isKnown =
+            face && face->units_per_EM > 0 &&
+            FT_Get_Advance(face, static_cast<FT_UInt>(glyph), FT_LOAD_NO_SCALE, &units) == 0;
+        advance = isKnown ? static_cast<float>(units) / static_cast<float>(face->units_per_EM) : 0;
+    }
+    return advance;
+}
+
+TextFont& FontBook::find(fz_font* font) {
+    std::unique_ptr<TextFont>& entry = fonts[font];
+    if (!entry) {
+        entry = std::make_unique<TextFont>(ctx, font);
+    }
+    return *entry;
+}
+
+void FontBook::startDocument() {
+    if (fonts.size() > maxFonts) {
+        fonts.clear();
+    }
+    for (const auto& font : fonts) {
+        font.second->startDocument();
+    }
+}
+
+} // namespace DrawmereConvert

@@ -1,0 +1,83 @@
+/// Text that keeps its characters.
+#pragma once
+
+#include "foundation/records/TLStringWithGlyphInfo.h"
+#include "tools/convert/Canvas.h"
+#include "tools/convert/ConvertOptions.h"
+#include "tools/convert/PageReport.h"
+#include "tools/convert/TextFont.h"
+
+#include <mupdf/fitz.h>
+
+#include <string>
+#include <vector>
+
+namespace DrawmereConvert {
+
+/// How a text is painted.
+struct TextPaint {
+    PAINTMODE mode = PAINTMODE_FILL; ///< nothing, for text that is only to be found
+    Paint fill{};
+    Paint stroke{};
+    Pen pen{};
+};
+
+/// A span of text in one font, ready to be written.
+class TextSpan {
+public:
+    /// Shape: `matrix`, of the text.
+    TextSpan(const fz_text_span& span, const fz_matrix& matrix, TextFont& textFont);
+
+    bool isEmpty() const { return clusters.empty() || !(size > 0); }
+
+    /// Returns: where the text is, roughly, in the coordinates of the document.
+    fz_rect getBounds() const;
+
+    /// Glyphs, each with the characters it stands for. Shape: points in the coordinates of the
+    /// text, which `turn` leads to those of the document.
+    struct Cluster {
+        std::u16string text;
+        int glyph = 0;
+        fz_point at{};
+        float advance = 0; ///< in points
+    };
+
+    TextFont& font;
+    float size = 0;               ///< of the font, in points
+    fz_matrix turn = fz_identity; ///< does not change sizes
+    bool isTurned = false;
+    std::vector<Cluster> clusters;
+};
+
+/// Writes spans as text elements, as few as put every glyph where it belongs.
+class TextWriter {
+public:
+    TextWriter(Canvas& target, TEXTMODE textMode) : canvas(target), mode(textMode) {}
+
+    /// Draws a span. The document must be ready for it.
+    void write(const TextSpan& span, const TextPaint& paint);
+
+private:
+    /// The text element in the making.
+    struct Line {
+        UnicodeString text;
+        std::vector<float> x;   // one for each character
+        std::size_t placed = 0; // how many need one; the others follow by themselves
+        float next = 0;         // where a character is that follows by itself
+        std::vector<TalFont::TLGlyphEntry> glyphs;
+        float y = 0;
+        int variant = 0;
+        bool isLigature = false;
+    };
+
+    bool startsLine(const TextSpan::Cluster& cluster, int variant) const;
+    void add(const TextSpan::Cluster& cluster);
+    void flushLine(const TextSpan& span, const TextPaint& paint);
+    void setPaint(const TextPaint& paint);
+
+    Canvas& canvas;
+    TEXTMODE mode;
+    Line line;
+};
+
+} // namespace DrawmereConvert

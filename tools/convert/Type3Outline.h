@@ -1,0 +1,23 @@
+/// The glyphs of Type 3 fonts, which are drawings, as outlines.
+#pragma once
+
+#include "tools/convert/PathData.h"
+
+#include <mupdf/fitz.h>
+
+#include <vector>
+
+namespace DrawmereConvert {
+
+/// The steps of an outline with points that are not rounded.
+struct LooseOutline {
+    std::vector<PATHSTEP> steps;
+    std::vector<fz_point> points;
+};
+
+/// Appends to `outline` what a glyph draws, in units of the em. Bitmaps are traced.
+/// Returns: false, with nothing appended, for a glyph with colours of its own or with anything but
+/// filled paths and bitmaps.
+bool readType3Outline(fz_context* ctx, fz_font* font, int glyph, LooseOutline& outline);
+
+} // namespace DrawmereConvert
