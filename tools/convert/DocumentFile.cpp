@@ -1,6 +1,7 @@
 #include "tools/convert/DocumentFile.h"
 
 #include "tools/convert/ConvertError.h"
+#include "tools/convert/SharedFile.h"
 
 #include <algorithm>
 #include <cstdlib>
@@ -13,6 +14,30 @@ namespace {
 
 constexpr std::size_t storeBytes = std::size_t{64} << 20U;
 constexpr std::size_t maxMessages = 100; // a broken page can repeat itself without end
+
+/// Returns: whether what reads the document goes on to read its file page by page. The others hold
+/// all of it from the beginning, or look for further files beside it.
+bool keepsFile(fz_context* ctx, const char* name) {
+    const fz_document_handler* const handler = fz_recognize_document(ctx, name);
+    for (const char* const kind : {".pdf", ".xps", ".epub", ".cbz"}) {
+        if (handler == fz_recognize_document(ctx, kind)) {
+            return true;
+        }
+    }
+    return false;
+}
+
+fz_document* openShared(fz_context* ctx, const char* name) {
+    if (!keepsFile(ctx, name)) {
+        return fz_open_document(ctx, name);
+    }
+    fz_document* document = nullptr;
+    fz_stream* const stream = openSharedFile(ctx, name);
+    fz_try(ctx) { document = fz_open_document_with_stream(ctx, name, stream); }
+    fz_always(ctx) { fz_drop_stream(ctx, stream); }
+    fz_catch(ctx) { fz_rethrow(ctx); }
+    return document;
+}
 
 } // namespace
 
@@ -43,7 +68,7 @@ void DocumentFile::openDocument(const std::string& path) {
     const char* name = path.c_str();
     if (!callFitz(ctx, [&] {
             fz_register_document_handlers(ctx);
-            document = fz_open_document(ctx, name);
+            document = openShared(ctx, name);
         })) {
         throw ConvertError(CONVERTERROR_UNREADABLE, takeFitzMessage(ctx));
     }

@@ -27,6 +27,16 @@ enum APPROXIMATION : std::int32_t {
 /// Returns: the words for `count` of `kind`, for instance "2 blend modes left out".
 std::string describeApproximation(APPROXIMATION kind, int count);
 
+/// A link of the page, for what lies over pictures of pages. Units: points from the page's top
+/// left.
+struct PageLink {
+    float x = 0;
+    float y = 0;
+    float width = 0;
+    float height = 0;
+    std::string target; ///< UTF-8, as it is handed to `Drawmere::startLink`
+};
+
 struct PageReport {
     void note(APPROXIMATION kind) { ++approximations.at(static_cast<std::size_t>(kind)); }
 
@@ -39,6 +49,7 @@ struct PageReport {
     std::array<int, APPROXIMATION_COUNT> approximations{};
     bool isComplete = true;            ///< false when a part of the page is missing
     std::vector<std::string> messages; ///< errors and warnings of the parser, without repetitions
+    std::vector<PageLink> links;       ///< in the order in which they are drawn
 };
 
 } // namespace DrawmereConvert

@@ -1,0 +1,189 @@
+// compare-pages [-d DIRECTORY] EXPECTED.png PAGE.png...: for each pair prints a line with the share
+// of pixels that differ visibly, in percent. Pictures are blurred by one pixel before, so that what
+// renderers make of an edge doesn't count. With -d, pictures of both beside each other and of the
+// difference go to the directory, named like the page.
+
+#include <algorithm>
+#include <array>
+#include <cstdint>
+#include <cstdio>
+#include <cstdlib>
+#include <exception>
+#include <filesystem>
+#include <iterator>
+#include <memory>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include <cairo.h>
+
+namespace {
+
+constexpr int visible = 32; // of 255, in the channel that differs most
+constexpr int channelCount = 3;
+constexpr std::uint32_t white = 0xFFFFFF;
+
+struct SurfaceDeleter {
+    void operator()(cairo_surface_t* surface) const { cairo_surface_destroy(surface); }
+};
+
+using Surface = std::unique_ptr<cairo_surface_t, SurfaceDeleter>;
+
+/// A picture on white, whatever lies outside of it white, too.
+struct Pixels {
+    int width = 0;
+    int height = 0;
+    std::vector<std::uint32_t> values; // 0x00RRGGBB
+
+    std::uint32_t at(int x, int y) const {
+        const bool isInside = x >= 0 && y >= 0 && x < width && y < height;
+        return isInside ? values[static_cast<std::size_t>(y) * width + x] : white;
+    }
+};
+
+int channel(std::uint32_t pixel, int index) {
+    constexpr unsigned int bits = 8;
+    return static_cast<int>(pixel >> (bits * static_cast<unsigned int>(index)) & 0xFFU);
+}
+
+std::uint32_t onWhite(std::uint32_t pixel) { // the channels carry their share of alpha already
+    const auto rest = 255 - (pixel >> 24U);
+    return (pixel & white) + rest * 0x010101U;
+}
+
+Pixels readPixels(const char* path) {
+    const Surface file(cairo_image_surface_create_from_png(path));
+    if (cairo_surface_status(file.get()) != CAIRO_STATUS_SUCCESS) {
+        throw std::runtime_error(std::string(path) + ": no picture");
+    }
+    Pixels pixels;
+    pixels.width = cairo_image_surface_get_width(file.get());
+    pixels.height = cairo_image_surface_get_height(file.get());
+    const Surface image(
+        cairo_image_surface_create(CAIRO_FORMAT_ARGB32, pixels.width, pixels.height));
+    const std::unique_ptr<cairo_t, decltype(&cairo_destroy)> context(cairo_create(image.get()),
+                                                                     &cairo_destroy);
+    cairo_set_source_surface(context.get(), file.get(), 0, 0);
+    cairo_paint(context.get());
+    cairo_surface_flush(image.get());
+    const auto* const bytes = cairo_image_surface_get_data(image.get());
+    const int stride = cairo_image_surface_get_stride(image.get());
+    for (int y = 0; y < pixels.height; ++y) {
+        const void* const row = bytes + static_cast<std::ptrdiff_t>(y) * stride;
+        const auto* const line = static_cast<const std::uint32_t*>(row);
+        std::transform(line, line + pixels.width, std::back_inserter(pixels.values), onWhite);
+    }
+    return pixels;
+}
+
+using Color = std::array<int, channelCount>;
+
+/// Returns: the mean of the pixel and its neighbours, times nine.
+Color blur(const Pixels& pixels, int x, int y) {
+    Color sum{};
+    for (int dy = -1; dy <= 1; ++dy) {
+        for (int dx = -1; dx <= 1; ++dx) {
+            const std::uint32_t pixel = pixels.at(x + dx, y + dy);
+            for (int i = 0; i < channelCount; ++i) {
+                sum.at(static_cast<std::size_t>(i)) += channel(pixel, i);
+            }
+        }
+    }
+    return sum;
+}
+
+/// Returns: whether a viewer sees a difference at this place.
+bool differs(const Pixels& one, const Pixels& other, int x, int y) {
+    constexpr int neighbours = 9;
+    const Color first = blur(one, x, y);
+    const Color second = blur(other, x, y);
+    int largest = 0;
+    for (std::size_t i = 0; i < first.size(); ++i) {
+        largest = std::max(largest, std::abs(first.at(i) - second.at(i)));
+    }
+    return largest > visible * neighbours;
+}
+
+struct Comparison {
+    int width = 0;
+    int height = 0;
+    std::vector<bool> isDifferent;
+
+    double percent() const {
+        const auto count = std::count(isDifferent.begin(), isDifferent.end(), true);
+        return isDifferent.empty()
+                   ? 100.0
+                   : 100.0 * static_cast<double>(count) / static_cast<double>(isDifferent.size());
+    }
+};
+
+// Renderers round the size of a page up or down, so the last row or column of one may be missing.
+int commonExtent(int one, int other) {
+    return std::abs(one - other) <= 1 ? std::min(one, other) : std::max(one, other);
+}
+
+Comparison compare(const Pixels& expected, const Pixels& page) {
+    Comparison result;
+    result.width = commonExtent(expected.width, page.width);
+    result.height = commonExtent(expected.height, page.height);
+    for (int y = 0; y < result.height; ++y) {
+        for (int x = 0; x < result.width; ++x) {
+            const bool isOutside = x >= std::min(expected.width, page.width) ||
+                                   y >= std::min(expected.height, page.height);
+            result.isDifferent.push_back(isOutside || differs(expected, page, x, y));
+        }
+    }
+    return result;
+}
+
+/// Writes the expected picture, the page and their difference beside each other.
+void writeTriple(const Pixels& expected, const Pixels& page, const Comparison& result,
+                 const std::string& path) {
+    const Surface image(
+        cairo_image_surface_create(CAIRO_FORMAT_RGB24, channelCount * result.width, result.height));
+    cairo_surface_flush(image.get());
+    auto* const bytes = cairo_image_surface_get_data(image.get());
+    const int stride = cairo_image_surface_get_stride(image.get());
+    for (int y = 0; y < result.height; ++y) {
+        void* const row = bytes + static_cast<std::ptrdiff_t>(y) * stride;
+        auto* const line = static_cast<std::uint32_t*>(row);
+        for (int x = 0; x < result.width; ++x) {
+            const std::size_t index = static_cast<std::size_t>(y) * result.width + x;
+            line[x] = expected.at(x, y);
+            line[result.width + x] = page.at(x, y);
+            line[2 * result.width + x] = result.isDifferent[index] ? 0xC00000U : white;
+        }
+    }
+    cairo_surface_mark_dirty(image.get());
+    cairo_surface_write_to_png(image.get(), path.c_str());
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    std::vector<const char*> files(argv + 1, argv + argc);
+    std::string directory;
+    if (files.size() > 1 && std::string(files.front()) == "-d") {
+        directory = files[1];
+        files.erase(files.begin(), files.begin() + 2);
+    }
+    int status = 0;
+    for (std::size_t i = 0; i + 1 < files.size(); i += 2) {
+        try {
+            const Pixels expected = readPixels(files[i]);
+            const Pixels page = readPixels(files[i + 1]);
+            const Comparison result = compare(expected, page);
+            std::printf("%.3f\n", result.percent());
+            if (!directory.empty()) {
+                const std::filesystem::path name = std::filesystem::path(files[i + 1]).filename();
+                writeTriple(expected, page, result, (directory / name).string());
+            }
+        } catch (const std::exception& error) {
+            std::printf("100.000\n");
+            std::fprintf(stderr, "compare-pages: %s\n", error.what());
+            status = 1;
+        }
+    }
+    return status;
+}

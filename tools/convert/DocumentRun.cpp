@@ -1,0 +1,235 @@
+#include "tools/convert/DocumentRun.h"
+
+#include "tools/convert/InterruptGuard.h"
+#include "tools/convert/JobPool.h"
+#include "tools/convert/PageWriter.h"
+#include "tools/convert/ProgressBar.h"
+#include "tools/convert/Watchdog.h"
+
+#include <algorithm>
+#include <cstdio>
+#include <filesystem>
+
+namespace DrawmereConvert {
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr int wholeDocument = -1;
+
+bool isSameFile(const std::string& one, const std::string& other) {
+    std::error_code failure;
+    return fs::equivalent(one, other, failure);
+}
+
+std::string describeApproximations(const PageReport& report) {
+    std::string text;
+    for (int kind = 0; kind < APPROXIMATION_COUNT; ++kind) {
+        const int count = report.approximations.at(static_cast<std::size_t>(kind));
+        if (count > 0) {
+            text += (text.empty() ? "" : ", ") +
+                    describeApproximation(static_cast<APPROXIMATION>(kind), count);
+        }
+    }
+    return text;
+}
+
+} // namespace
+
+DocumentRun::DocumentRun(const RunOptions& runOptions, const std::string& path,
+                         FileOwners& fileOwners)
+    : options(runOptions), input(path), owners(fileOwners), converter(runOptions.convert) {}
+
+void DocumentRun::say(const std::string& text) const {
+    std::fprintf(stderr, "%s: %s\n", input.c_str(), text.c_str());
+}
+
+DOCUMENTSTATE DocumentRun::run() {
+    const std::string late = input + ": it takes too long to read the document\n";
+    endProcessAfter(options.timeout, late.c_str(), EXITSTATUS_UNREADABLE);
+    const DOCUMENTSTATE opened = open();
+    if (opened == DOCUMENTSTATE_DONE) {
+        converter.findDestinations(targets);
+    }
+    endProcessAfter(0, "", 0);
+    return opened == DOCUMENTSTATE_DONE ? convert() : opened;
+}
+
+DOCUMENTSTATE DocumentRun::open() {
+    try {
+        converter.open(input, options.password);
+    } catch (const std::exception& error) {
+        say(error.what());
+        return DOCUMENTSTATE_UNREADABLE;
+    }
+    const int count = converter.getPageCount();
+    pages = options.pages.select(count);
+    if (pages.empty()) {
+        say("none of the pages asked for is among its " + std::to_string(count));
+        return DOCUMENTSTATE_MISUSE;
+    }
+    const OutputNames names(options, input, count);
+    directory = names.getDirectory();
+    targets.singleFile = options.isOneDocument();
+    nameTargets(names);
+    return options.writesToOutput() ? DOCUMENTSTATE_DONE : checkFiles(names);
+}
+
+void DocumentRun::nameTargets(const OutputNames& names) {
+    targets.files.resize(static_cast<std::size_t>(converter.getPageCount()));
+    for (const int page : pages) {
+        targets.files.at(static_cast<std::size_t>(page)) = UnicodeString::fromUTF8(
+            OutputNames::toReference(names.getPageFile(page, pages.size() == 1)));
+    }
+}
+
+DOCUMENTSTATE DocumentRun::checkFiles(const OutputNames& names) {
+    for (const int page : pages) {
+        const std::string file = names.getDirectory() +
+                                 (options.singleFile ? names.getWholeFile()
+                                                     : names.getPageFile(page, pages.size() == 1));
+        for (const std::string& other : options.inputs) {
+            if (isSameFile(file, other)) {
+                say(file + " would take the place of a document that is converted");
+                return DOCUMENTSTATE_MISUSE;
+            }
+        }
+        const std::string& owner = owners.emplace(file, input).first->second;
+        if (owner != input) {
+            say(file + " would take the place of a page of " + owner);
+            return DOCUMENTSTATE_MISUSE;
+        }
+    }
+    return DOCUMENTSTATE_DONE;
+}
+
+DOCUMENTSTATE DocumentRun::convert() {
+    const OutputNames names(options, input, converter.getPageCount());
+    const InterruptGuard guard; // outlives the files in progress, so they are gone before it ends
+    try {
+        std::unique_ptr<PartialFiles> files;
+        if (!options.writesToOutput()) {
+            files = std::make_unique<PartialFiles>(names.getDirectory());
+        }
+        if (!runPool(names, files.get(), guard)) {
+            return DOCUMENTSTATE_INTERRUPTED;
+        }
+    } catch (const fs::filesystem_error& error) {
+        say(error.path1().string() + ": " + error.code().message());
+        return DOCUMENTSTATE_MISUSE;
+    }
+    return sum();
+}
+
+bool DocumentRun::runPool(const OutputNames& names, const PartialFiles* files,
+                          const InterruptGuard& guard) {
+    const PageJob job = {options, converter, targets, names, files, pages.size() == 1};
+    ProgressBar bar(input, static_cast<int>(pages.size()), !options.quiet);
+    PoolTask task;
+    task.pages = pages;
+    task.isOneDocument = options.isOneDocument();
+    task.jobs = options.jobs;
+    task.timeout = options.timeout;
+    task.makeWriter = [&job](int room) { return makePageWriter(job, room); };
+    task.take = [this, &bar](const PageOutcome& outcome) { take(outcome, bar); };
+    return JobPool(task, guard).run();
+}
+
+void DocumentRun::take(const PageOutcome& outcome, ProgressBar& bar) {
+    PageOutcome& kept = outcomes[outcome.page];
+    kept = outcome;
+    if (options.index == INDEXMODE_NEVER) {
+        kept.report.links.clear();
+    }
+    if (outcome.page != wholeDocument) {
+        bar.advance();
+    }
+}
+
+DOCUMENTSTATE DocumentRun::sum() const {
+    PageReport all;
+    std::size_t written = 0;
+    bool isUnreadable = true;
+    for (const auto& [page, outcome] : outcomes) {
+        sayPage(outcome);
+        all.add(outcome.report);
+        written += outcome.isWritten && page != wholeDocument ? 1 : 0;
+        isUnreadable = isUnreadable && (outcome.isUnreadable || page == wholeDocument);
+    }
+    const auto whole = outcomes.find(wholeDocument);
+    if (whole != outcomes.end() && !whole->second.isWritten) {
+        written = 0;
+    }
+    if (isUnreadable) {
+        return DOCUMENTSTATE_UNREADABLE;
+    }
+    if (!options.quiet) {
+        saySum(all, written);
+    }
+    const bool isDone = all.isComplete && written == pages.size();
+    return isDone ? DOCUMENTSTATE_DONE : DOCUMENTSTATE_INCOMPLETE;
+}
+
+void DocumentRun::sayPage(const PageOutcome& outcome) const {
+    const std::string place =
+        outcome.page == wholeDocument ? "" : "page " + std::to_string(outcome.page + 1) + ": ";
+    if (outcome.isLate) {
+        say(place + "given up when its time was over");
+    } else if (!outcome.error.empty()) {
+        say(place + outcome.error);
+    } else if (!outcome.report.isComplete) {
+        say(place + "not all of it can be read");
+    }
+    if (options.verbose && outcome.report.countApproximations() > 0) {
+        say(place + describeApproximations(outcome.report));
+    }
+    if (options.verbose || (!outcome.report.isComplete && !options.quiet)) {
+        for (const std::string& message : outcome.report.messages) {
+            say(place + message);
+        }
+    }
+}
+
+/// Returns: the file when there is one, else the directory, as a reader would write it.
+std::string DocumentRun::describePlace() const {
+    const OutputNames names(options, input, converter.getPageCount());
+    std::string place =
+        directory == "./" ? directory : directory.substr(directory.starts_with("./") ? 2 : 0);
+    if (options.singleFile) {
+        place += names.getWholeFile();
+    } else if (pages.size() == 1) {
+        place += names.getPageFile(pages.front(), true);
+    }
+    return place;
+}
+
+void DocumentRun::saySum(const PageReport& all, std::size_t written) const {
+    std::string text = std::to_string(written) + (written == 1 ? " page" : " pages") + " written";
+    if (!options.writesToOutput()) {
+        text += " to " + describePlace();
+    }
+    if (written < pages.size()) {
+        text += ", " + std::to_string(pages.size() - written) + " failed";
+    }
+    const std::string approximations = describeApproximations(all);
+    say(text + (approximations.empty() ? "" : "; " + approximations));
+}
+
+IndexDocument DocumentRun::describe() const {
+    const OutputNames names(options, input, converter.getPageCount());
+    IndexDocument document;
+    document.title = converter.getTitle();
+    if (document.title.empty()) {
+        document.title = fs::path(input).stem().string();
+    }
+    document.outline = converter.getOutline();
+    for (const auto& [page, outcome] : outcomes) {
+        if (outcome.isWritten) {
+            document.entries.push_back({names.getPageFile(page, pages.size() == 1), page + 1,
+                                        outcome.size, outcome.report.links});
+        }
+    }
+    return document;
+}
+
+} // namespace DrawmereConvert

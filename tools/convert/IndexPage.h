@@ -1,0 +1,34 @@
+/// A page that shows all pages.
+#pragma once
+
+#include "tools/convert/DocumentConverter.h"
+
+#include <string>
+#include <vector>
+
+namespace DrawmereConvert {
+
+/// A page as the index shows it.
+struct IndexEntry {
+    std::string file; ///< UTF-8, beside the index
+    int number = 1;   ///< in its document
+    PageSize size;
+    std::vector<PageLink> links;
+};
+
+/// A document as the index shows it.
+struct IndexDocument {
+    std::string title;                 ///< UTF-8
+    std::vector<OutlineEntry> outline; ///< only what leads to one of `entries` is shown
+    std::vector<IndexEntry> entries;
+};
+
+/// Returns: the page as HTML: all pages below each other, each read when it comes near, with their
+/// links, the outlines, buttons and keys for the next and previous page and for the size. It needs
+/// nothing but the files of the pages.
+std::string makeIndexPage(const std::vector<IndexDocument>& documents);
+
+/// Returns: whether `bytes` are a page that `makeIndexPage` made.
+bool isIndexPage(const std::string& bytes);
+
+} // namespace DrawmereConvert

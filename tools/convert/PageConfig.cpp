@@ -1,0 +1,38 @@
+#include "tools/convert/PageConfig.h"
+
+namespace DrawmereConvert {
+
+using MoxCommonNS::MoxName;
+
+void fillConfig(SVGConfig& config, const RunOptions& options) {
+    config.svgType = options.profile;
+    config.gzip = options.gzip;
+    config.saveOption = u"decimals=3";
+    config.setImageProcessingType(MoxName(UnicodeString::fromUTF8(options.images)));
+    config.setImageConversion(MoxName(UnicodeString::fromUTF8(options.imageFormat)));
+    config.downsampleDpi = options.dpi;
+    config.jpegQuality = options.quality;
+    config.wispMode = options.smallDevice;
+    if (options.maxSize > 0) {
+        config.wispOptions = UnicodeString::fromUTF8("maxsize=" + std::to_string(options.maxSize) +
+                                                     ",errorsvg=" + options.errorSvg);
+    }
+    config.adjustConfig();
+}
+
+void takeErrors(SVGConfig& config, PageOutcome& outcome) {
+    for (const MoxCommonNS::MoxError& error : config.errors) {
+        std::string text;
+        noteFault(outcome, error.getMessage().toUTF8String(text));
+    }
+    config.clearError();
+}
+
+void noteFault(PageOutcome& outcome, const std::string& reason) {
+    outcome.report.isComplete = false;
+    if (outcome.error.empty()) {
+        outcome.error = reason;
+    }
+}
+
+} // namespace DrawmereConvert

@@ -1,0 +1,41 @@
+#include "tools/convert/PartialFiles.h"
+
+#include <cerrno>
+#include <filesystem>
+#include <system_error>
+
+#include <stdlib.h> // mkdtemp is no part of standard C++
+
+namespace DrawmereConvert {
+
+namespace fs = std::filesystem;
+
+PartialFiles::PartialFiles(const std::string& targetPath)
+    : target(targetPath), place(targetPath + ".drawmere-XXXXXX") {
+    madeTarget = fs::create_directories(target);
+    if (!mkdtemp(place.data())) {
+        throw fs::filesystem_error("can't write there", target,
+                                   std::error_code(errno, std::generic_category()));
+    }
+    place += '/';
+}
+
+PartialFiles::~PartialFiles() {
+    std::error_code ignored;
+    fs::remove_all(place, ignored);
+    if (madeTarget) {
+        fs::remove(target, ignored); // an empty one only
+    }
+}
+
+std::string PartialFiles::makeRoom(int number) const {
+    const std::string room = place + std::to_string(number) + "/";
+    fs::create_directory(room);
+    return room;
+}
+
+void PartialFiles::moveOut(const std::string& from, const std::string& name) const {
+    fs::rename(from, target + name);
+}
+
+} // namespace DrawmereConvert

@@ -1,0 +1,101 @@
+#include "tools/convert/WholeDocumentWriter.h"
+
+#include "tools/convert/Watchdog.h"
+
+#include <algorithm>
+#include <filesystem>
+#include <iostream>
+
+namespace DrawmereConvert {
+namespace {
+
+constexpr float gap = 12; // points between pages
+
+MoxCommonNS::MoxLength toLength(float points) {
+    return MoxCommonNS::MoxLength(points, MoxCommonNS::MOXUNIT_POINT);
+}
+
+} // namespace
+
+WholeDocumentWriter::WholeDocumentWriter(const PageJob& pageJob, const std::string& place)
+    : job(pageJob), room(place), uri(UnicodeString::fromUTF8(room + job.names.getWholeFile())),
+      drawmere(&config, &uri) {
+    fillConfig(config, job.options);
+    config.singleFile = true;
+    config.streamOutput = room.empty();
+    config.svgOutputUri = uri.getText();
+    config.copyNamePrefix = UnicodeString::fromUTF8(job.names.getPageStem(0, true) + "-");
+}
+
+PageOutcome WholeDocumentWriter::write(int page) {
+    PageOutcome outcome;
+    outcome.page = page;
+    try {
+        open();
+        const Watchdog watchdog(job.converter, job.options.timeout);
+        drawPage(page, outcome);
+        outcome.isWritten = true;
+        outcome.isLate = watchdog.hasBarked();
+    } catch (const ConvertError& error) {
+        outcome.isUnreadable = true;
+        noteFault(outcome, error.what());
+    } catch (const std::exception& error) {
+        noteFault(outcome, error.what());
+    }
+    takeErrors(config, outcome);
+    return outcome;
+}
+
+void WholeDocumentWriter::open() {
+    if (isOpen) {
+        return;
+    }
+    if (room.empty()) {
+        drawmere.initRootSvg(&std::cout);
+    } else {
+        drawmere.initRootSvg(uri.getText());
+    }
+    isOpen = true;
+}
+
+void WholeDocumentWriter::drawPage(int page, PageOutcome& outcome) {
+    outcome.size = job.converter.loadPage(page);
+    PagePlace place;
+    place.number = page + 1;
+    place.isSingle = false;
+    place.offset = size.height > 0 ? size.height + gap : 0;
+    outcome.report = job.converter.drawPage(place, job.targets, drawmere);
+    size.width = std::max(size.width, outcome.size.width);
+    size.height = place.offset + outcome.size.height;
+}
+
+PageOutcome WholeDocumentWriter::finish() {
+    PageOutcome outcome;
+    outcome.page = -1;
+    try {
+        save();
+        outcome.isWritten = true;
+    } catch (const std::exception& error) {
+        noteFault(outcome, error.what());
+    }
+    takeErrors(config, outcome);
+    return outcome;
+}
+
+void WholeDocumentWriter::save() {
+    drawmere.setCanvasSize(toLength(size.width), toLength(size.height));
+    drawmere.finishRootSvg();
+    drawmere.finish();
+    if (room.empty()) {
+        if (!std::cout.flush()) {
+            throw std::runtime_error("the standard output takes no more");
+        }
+        return;
+    }
+    for (const auto& entry : std::filesystem::directory_iterator(room)) {
+        const std::string name = entry.path().filename().string();
+        job.files->moveOut(room + name, name);
+    }
+}
+
+} // namespace DrawmereConvert
