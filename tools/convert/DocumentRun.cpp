@@ -216,7 +216,6 @@ void DocumentRun::saySum(const PageReport& all, std::size_t written) const {
 }
 
 IndexDocument DocumentRun::describe() const {
-    const OutputNames names(options, input, converter.getPageCount());
     IndexDocument document;
     document.title = converter.getTitle();
     if (document.title.empty()) {
@@ -225,11 +224,24 @@ IndexDocument DocumentRun::describe() const {
     document.outline = converter.getOutline();
     for (const auto& [page, outcome] : outcomes) {
         if (outcome.isWritten) {
-            document.entries.push_back({names.getPageFile(page, pages.size() == 1), page + 1,
-                                        outcome.size, outcome.report.links});
+            document.entries.push_back(describePage(outcome));
         }
     }
     return document;
+}
+
+IndexEntry DocumentRun::describePage(const PageOutcome& outcome) const {
+    const auto page = static_cast<std::size_t>(outcome.page);
+    IndexEntry entry;
+    entry.page = outcome.page;
+    entry.size = outcome.size;
+    entry.links = outcome.report.links;
+    targets.files.at(page).toUTF8String(entry.file);
+    for (const LinkDestination& destination : targets.destinations.at(page)) {
+        std::string id;
+        entry.anchors.push_back({destination.id.toUTF8String(id), destination.y});
+    }
+    return entry;
 }
 
 } // namespace DrawmereConvert

@@ -53,6 +53,7 @@ private:
     DOCUMENTSTATE sum() const;
     void sayPage(const PageOutcome& outcome) const;
     std::string describePlace() const;
+    IndexEntry describePage(const PageOutcome& outcome) const;
     void saySum(const PageReport& all, std::size_t written) const;
 
     const RunOptions& options;

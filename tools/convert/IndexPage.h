@@ -8,18 +8,25 @@
 
 namespace DrawmereConvert {
 
+/// A place in a page to which links lead.
+struct IndexAnchor {
+    std::string id; ///< UTF-8
+    float y = 0;    ///< points from the top
+};
+
 /// A page as the index shows it.
 struct IndexEntry {
-    std::string file; ///< UTF-8, beside the index
-    int number = 1;   ///< in its document
+    std::string file; ///< UTF-8, as a reference from the index
+    int page = 0;     ///< counted from 0 in its document
     PageSize size;
     std::vector<PageLink> links;
+    std::vector<IndexAnchor> anchors;
 };
 
 /// A document as the index shows it.
 struct IndexDocument {
-    std::string title;                 ///< UTF-8
-    std::vector<OutlineEntry> outline; ///< only what leads to one of `entries` is shown
+    std::string title; ///< UTF-8
+    std::vector<OutlineEntry> outline;
     std::vector<IndexEntry> entries;
 };
 
@@ -28,7 +35,7 @@ struct IndexDocument {
 /// nothing but the files of the pages.
 std::string makeIndexPage(const std::vector<IndexDocument>& documents);
 
-/// Returns: whether `bytes` are a page that `makeIndexPage` made.
+/// Returns: whether `bytes` begin like a page that `makeIndexPage` made.
 bool isIndexPage(const std::string& bytes);
 
 } // namespace DrawmereConvert
