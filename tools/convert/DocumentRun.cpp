@@ -174,7 +174,8 @@ void DocumentRun::sayPage(const PageOutcome& outcome) const {
     const std::string place =
         outcome.page == wholeDocument ? "" : "page " + std::to_string(outcome.page + 1) + ": ";
     if (outcome.isLate) {
-        say(place + "given up when its time was over");
+        say(place + (outcome.isWritten ? "its time was over before all of it was drawn"
+                                       : "given up, for its time was over"));
     } else if (!outcome.error.empty()) {
         say(place + outcome.error);
     } else if (!outcome.report.isComplete) {

@@ -22,7 +22,7 @@ PageOutcome FilePageWriter::write(int page) {
         drawPage(page, config, outcome);
         moveFiles(job.names.getPageFile(page, job.isSinglePage));
         outcome.isWritten = true;
-        outcome.isLate = watchdog.hasBarked();
+        noteLateness(outcome, watchdog.hasBarked());
     } catch (const ConvertError& error) {
         outcome.isUnreadable = true;
         noteFault(outcome, error.what());

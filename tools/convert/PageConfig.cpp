@@ -35,4 +35,9 @@ void noteFault(PageOutcome& outcome, const std::string& reason) {
     }
 }
 
+void noteLateness(PageOutcome& outcome, bool isLate) {
+    outcome.isLate = isLate;
+    outcome.report.isComplete = outcome.report.isComplete && !isLate;
+}
+
 } // namespace DrawmereConvert

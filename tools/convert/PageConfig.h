@@ -18,4 +18,7 @@ void takeErrors(SVGConfig& config, PageOutcome& outcome);
 /// Says in the outcome that something of the page is missing, and why. The first reason stays.
 void noteFault(PageOutcome& outcome, const std::string& reason);
 
+/// Says in the outcome whether the page was given up when its time was over.
+void noteLateness(PageOutcome& outcome, bool isLate);
+
 } // namespace DrawmereConvert

@@ -35,7 +35,7 @@ PageOutcome WholeDocumentWriter::write(int page) {
         const Watchdog watchdog(job.converter, job.options.timeout);
         drawPage(page, outcome);
         outcome.isWritten = true;
-        outcome.isLate = watchdog.hasBarked();
+        noteLateness(outcome, watchdog.hasBarked());
     } catch (const ConvertError& error) {
         outcome.isUnreadable = true;
         noteFault(outcome, error.what());

@@ -1,0 +1,214 @@
+// What the program writes.
+#include "tests/convert/Conversion.h"
+#include "tests/convert/TinyPdf.h"
+#include "tests/support/Gunzip.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+namespace DrawmereTest {
+namespace {
+
+using testing::ElementsAre;
+using testing::HasSubstr;
+using testing::Not;
+using testing::StartsWith;
+
+/// A conversion of a document of twelve plain pages.
+struct TwelvePages : testing::Test {
+    TwelvePages() { conversion.directory.write("a.pdf", makePlainPdf(12)); }
+
+    /// Runs the converter to its end, without complaint.
+    std::string run(std::vector<std::string> words) const {
+        words.insert(words.begin(), "a.pdf");
+        const CommandResult result = conversion.run(words);
+        EXPECT_EQ(result.status, 0) << result.output;
+        return result.output;
+    }
+
+    Conversion conversion;
+};
+
+using ProgramRun = TwelvePages;
+
+TEST_F(ProgramRun, EveryPageGetsAFileAndAllOfThemAnIndex) {
+    EXPECT_EQ(run({"-o", "out/"}), "a.pdf: 12 pages written to out/\n");
+    EXPECT_THAT(conversion.list("out"),
+                ElementsAre("a01.svg", "a02.svg", "a03.svg", "a04.svg", "a05.svg", "a06.svg",
+                            "a07.svg", "a08.svg", "a09.svg", "a10.svg", "a11.svg", "a12.svg",
+                            "index.html"));
+    EXPECT_EQ(runCommand({"xmllint", "--noout", conversion.directory.path("out/a07.svg")}).output,
+              "");
+    EXPECT_THAT(conversion.directory.read("out/a07.svg"), HasSubstr("width=\"200pt\""));
+}
+
+TEST_F(ProgramRun, WithoutAnOutputPagesGoToTheCurrentDirectory) {
+    run({"--pages", "2-3", "--no-index"});
+    EXPECT_THAT(conversion.list(), ElementsAre("a.pdf", "a02.svg", "a03.svg"));
+}
+
+TEST_F(ProgramRun, PagesKeepTheirNumbersWhenOnlySomeAreWritten) {
+    run({"--pages", "11-,2", "-o", "out/p.svg", "--number-format", "001", "--no-index"});
+    EXPECT_THAT(conversion.list("out"), ElementsAre("p002.svg", "p011.svg", "p012.svg"));
+    run({"-o", "whole/p.svg", "--number-format", "001"});
+    EXPECT_EQ(conversion.directory.read("out/p011.svg"),
+              conversion.directory.read("whole/p011.svg"));
+}
+
+TEST_F(ProgramRun, ASinglePageHasThePlainNameAndNoIndex) {
+    EXPECT_EQ(run({"--pages", "4", "-o", "out/"}), "a.pdf: 1 page written to out/a.svg\n");
+    EXPECT_THAT(conversion.list("out"), ElementsAre("a.svg"));
+    run({"--pages", "4", "-o", "kept/", "--keep-number", "--number-format", "i", "--index"});
+    EXPECT_THAT(conversion.list("kept"), ElementsAre("aiv.svg", "index.html"));
+}
+
+TEST_F(ProgramRun, ASingleFileHoldsAllPagesBelowEachOther) {
+    EXPECT_EQ(run({"--single-file", "-o", "out/all.svg"}),
+              "a.pdf: 12 pages written to out/all.svg\n");
+    EXPECT_THAT(conversion.list("out"), ElementsAre("all.svg"));
+    const std::string svg = conversion.directory.read("out/all.svg");
+    EXPECT_EQ(runCommand({"xmllint", "--noout", conversion.directory.path("out/all.svg")}).output,
+              "");
+    EXPECT_THAT(svg, HasSubstr("width=\"200pt\" height=\"1332pt\"")); // 12 pages, 11 gaps
+}
+
+TEST_F(ProgramRun, TheStandardOutputTakesTheSameDocument) {
+    run({"--single-file", "-o", "all.svg"});
+    const CommandResult result = conversion.runShell("$convert a.pdf -o - 2>/dev/null");
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.output, conversion.directory.read("all.svg"));
+}
+
+TEST_F(ProgramRun, AClosedStandardOutputIsAFailure) {
+    const CommandResult result = conversion.runShell("$convert a.pdf -o - >/dev/full");
+    EXPECT_EQ(result.status, 1);
+    EXPECT_THAT(result.output, HasSubstr("a.pdf: "));
+    EXPECT_THAT(result.output, HasSubstr("0 pages written, 12 failed"));
+}
+
+TEST_F(ProgramRun, CompressedPagesHoldTheSame) {
+    run({"--pages", "1-2", "-o", "plain/", "--no-index"});
+    run({"--pages", "1-2", "-o", "small/", "--gzip", "--no-index"});
+    EXPECT_THAT(conversion.list("small"), ElementsAre("a01.svgz", "a02.svgz"));
+    EXPECT_EQ(gunzip(conversion.directory.read("small/a02.svgz")),
+              conversion.directory.read("plain/a02.svg"));
+}
+
+TEST_F(ProgramRun, ProfilesAreTheLibrarys) {
+    for (const std::string profile : {"full", "basic", "tiny", "plazmic"}) {
+        run({"--pages", "1", "--profile", profile, "-o", profile + ".svg"});
+    }
+    const std::string full = conversion.directory.read("full.svg");
+    EXPECT_THAT(conversion.directory.read("basic.svg"), HasSubstr("baseProfile=\"basic\""));
+    EXPECT_THAT(conversion.directory.read("tiny.svg"), HasSubstr("baseProfile=\"tiny\""));
+    EXPECT_THAT(conversion.directory.read("plazmic.svg"), HasSubstr("www.example.com/dtd"));
+    EXPECT_THAT(full, Not(HasSubstr("baseProfile")));
+}
+
+TEST_F(ProgramRun, TwiceGivesTheSameBytes) {
+    run({"-o", "out/"});
+    const std::string listing = conversion.runShell("cd out; cksum *").output;
+    run({"-o", "out/"});
+    EXPECT_EQ(conversion.runShell("cd out; cksum *").output, listing);
+}
+
+TEST_F(ProgramRun, QuietSaysNothingAndVerboseMore) { EXPECT_EQ(run({"--quiet"}), ""); }
+
+TEST_F(ProgramRun, AStrangersIndexIsNotReplaced) {
+    conversion.directory.write("index.html", "<p>mine</p>");
+    const CommandResult result = conversion.run({"a.pdf"});
+    EXPECT_EQ(result.status, 1);
+    EXPECT_THAT(result.output, HasSubstr("./index.html: it is not replaced"));
+    EXPECT_EQ(conversion.directory.read("index.html"), "<p>mine</p>");
+}
+
+TEST_F(ProgramRun, NamesMayHoldAnything) {
+    conversion.directory.write("a b#c%20.pdf", makePlainPdf(2));
+    EXPECT_EQ(conversion.run({"a b#c%20.pdf", "-o", "file:o/"}).status, 0);
+    EXPECT_THAT(conversion.list("file:o"),
+                ElementsAre("a b#c%201.svg", "a b#c%202.svg", "index.html"));
+    EXPECT_THAT(conversion.directory.read("file:o/index.html"),
+                HasSubstr("src=\"a%20b%23c%25202.svg\""));
+}
+
+TEST_F(ProgramRun, SeveralDocumentsShareAnIndex) {
+    conversion.directory.write("b.pdf", makePlainPdf(1));
+    EXPECT_EQ(run({"b.pdf", "--pages", "1", "-o", "out/"}),
+              "a.pdf: 1 page written to out/a.svg\nb.pdf: 1 page written to out/b.svg\n");
+    EXPECT_THAT(conversion.list("out"), ElementsAre("a.svg", "b.svg", "index.html"));
+}
+
+/// Returns: the checksums of all that a run makes of a document of the tests.
+std::string sumUp(const Conversion& conversion, const std::string& name,
+                  std::vector<std::string> words) {
+    words.insert(words.begin(), Conversion::document(name));
+    words.insert(words.end(), {"-q", "-o", "out/"});
+    EXPECT_EQ(conversion.run(words).status, 0);
+    return conversion.runShell("cd out; cksum *; rm *").output;
+}
+
+TEST(Jobs, AnyNumberOfThemGivesTheSameBytes) {
+    const Conversion conversion;
+    for (const std::string name : {"pdflatex-outline.pdf", "habibi-rotated.pdf"}) {
+        for (const std::string mode : {"outlines", "fonts", "plain"}) {
+            const std::string one = sumUp(conversion, name, {"--jobs", "1", "--text", mode});
+            EXPECT_EQ(sumUp(conversion, name, {"--jobs", "3", "--text", mode}), one);
+            EXPECT_THAT(one, HasSubstr("index.html"));
+        }
+    }
+}
+
+TEST(Images, WordsChooseWhereTheyGo) {
+    const Conversion conversion;
+    const std::string input = Conversion::document("image-streams-small.pdf");
+    EXPECT_EQ(conversion.run({input, "-o", "embedded/"}).status, 0);
+    EXPECT_EQ(conversion.list("embedded").size(), 10U);
+    EXPECT_THAT(conversion.directory.read("embedded/image-streams-small3.svg"),
+                HasSubstr("href=\"data:image/"));
+    EXPECT_EQ(conversion.run({input, "--images", "copy-all", "-o", "copied/"}).status, 0);
+    EXPECT_GE(conversion.list("copied").size(), 19U);
+    const std::string page = conversion.directory.read("copied/image-streams-small3.svg");
+    EXPECT_THAT(page, Not(HasSubstr("data:")));
+    EXPECT_THAT(page, HasSubstr("href=\"image-streams-small3-1."));
+}
+
+TEST(Images, ConversionResolutionAndQualityReachThem) {
+    const Conversion conversion;
+    const std::string input = Conversion::document("image-streams-small.pdf");
+    const auto convert = [&](const std::vector<std::string>& more) {
+        std::vector<std::string> words = {input, "--pages", "3", "-o", "x.svg"};
+        words.insert(words.end(), more.begin(), more.end());
+        EXPECT_EQ(conversion.run(words).status, 0);
+        return conversion.directory.read("x.svg");
+    };
+    const std::string jpeg = convert({"--image-format", "jpg-all"});
+    EXPECT_THAT(jpeg, HasSubstr("data:image/jpeg"));
+    EXPECT_LT(convert({"--image-format", "jpg-all", "--quality", "5"}).size(), jpeg.size());
+    EXPECT_LT(convert({"--image-format", "jpg-all", "--dpi", "5"}).size(), jpeg.size());
+}
+
+TEST(SmallDevice, PagesThatAreTooLargeAreReplaced) {
+    const Conversion conversion;
+    conversion.directory.write("a.pdf", TinyPdf()
+                                            .addPlainPage()
+                                            .addPage(std::string(500, ' ') +
+                                                     [] {
+                                                         std::string rects;
+                                                         for (int i = 0; i < 200; ++i) {
+                                                             rects +=
+                                                                 std::to_string(i) + " 5 9 9 re f ";
+                                                         }
+                                                         return rects;
+                                                     }())
+                                            .write());
+    conversion.directory.write("e.svg", "<svg/>");
+    const CommandResult result = conversion.run(
+        {"a.pdf", "--small-device", "--max-size", "2", "--error-svg", "e.svg", "-o", "out/"});
+    EXPECT_EQ(result.status, 1);
+    EXPECT_THAT(result.output, HasSubstr("page no = 2"));
+    EXPECT_THAT(conversion.directory.read("out/a1.svg"), HasSubstr("baseProfile=\"tiny\""));
+    EXPECT_EQ(conversion.directory.read("out/a2.svg"), "<svg/>");
+}
+
+} // namespace
+} // namespace DrawmereTest
