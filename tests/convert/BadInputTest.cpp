@@ -90,7 +90,7 @@ TEST(BadInput, ABrokenPageIsWrittenAsFarAsItGoesAndTheOthersWhole) {
     EXPECT_EQ(result.status, incomplete);
     EXPECT_THAT(result.output, HasSubstr("a.pdf: page 2: "));
     EXPECT_THAT(result.output, Not(HasSubstr("page 1: ")));
-    EXPECT_THAT(conversion.directory.read("out/a2.svg"), HasSubstr("h50"));
+    EXPECT_THAT(conversion.directory.read("out/a2.svg"), HasSubstr("width=\"50\""));
     EXPECT_TRUE(conversion.directory.has("out/a3.svg"));
 }
 

@@ -149,8 +149,8 @@ private:
     /// Throws: CLI::ParseError.
     void settle() {
         options.convert.maxMemory = maxMemory * mebibyte;
-        if (wantsIndex) {
-            options.index = *wantsIndex ? INDEXMODE_ALWAYS : INDEXMODE_NEVER;
+        if (app.count("--index") > 0) {
+            options.index = wantsIndex ? INDEXMODE_ALWAYS : INDEXMODE_NEVER;
         }
         settlePages();
         settleProfile();
@@ -207,7 +207,7 @@ private:
     CLI::App app{description, "drawmere-convert"};
     RunOptions options;
     std::string pages;
-    std::optional<bool> wantsIndex;
+    bool wantsIndex = false;
     std::size_t maxMemory = 2048;
     CLI::Option* smallDevice = nullptr; // borrowed from `app`
 };

@@ -122,7 +122,7 @@ PageReport DocumentConverter::drawPage(const PagePlace& place, const PageTargets
     }
     painter.finish();
     LinkWriter links(painter.canvas, targets, currentPage, {-bounds.x0, place.offset - bounds.y0});
-    links.writeLinks(readLinks(file->ctx, file->document, file->page));
+    links.writeLinks(readLinks(file->ctx, file->document, file->page), report);
     links.writeDestinations();
     drawmere.endPage();
     report.isComplete = report.isComplete && file->cookie.errors == 0;

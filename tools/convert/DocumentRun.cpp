@@ -194,14 +194,14 @@ void DocumentRun::sayPage(const PageOutcome& outcome) const {
 /// Returns: the file when there is one, else the directory, as a reader would write it.
 std::string DocumentRun::describePlace() const {
     const OutputNames names(options, input, converter.getPageCount());
-    std::string place =
-        directory == "./" ? directory : directory.substr(directory.starts_with("./") ? 2 : 0);
+    std::string file;
     if (options.singleFile) {
-        place += names.getWholeFile();
+        file = names.getWholeFile();
     } else if (pages.size() == 1) {
-        place += names.getPageFile(pages.front(), true);
+        file = names.getPageFile(pages.front(), true);
     }
-    return place;
+    const std::string place = directory.starts_with("./") ? directory.substr(2) : directory;
+    return place.empty() && file.empty() ? "./" : place + file;
 }
 
 void DocumentRun::saySum(const PageReport& all, std::size_t written) const {

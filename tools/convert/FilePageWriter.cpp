@@ -20,7 +20,9 @@ PageOutcome FilePageWriter::write(int page) {
     try {
         const Watchdog watchdog(job.converter, job.options.timeout);
         drawPage(page, config, outcome);
-        moveFiles(job.names.getPageFile(page, job.isSinglePage));
+        const std::string file = job.names.getPageFile(page, job.isSinglePage);
+        config.checkMaxFileSize(UnicodeString::fromUTF8(room + file), page + 1);
+        moveFiles(file);
         outcome.isWritten = true;
         noteLateness(outcome, watchdog.hasBarked());
     } catch (const ConvertError& error) {

@@ -164,13 +164,13 @@ private:
             html += "<i id=\"p" + number + "." + escape(anchor.id) +
                     "\" style=\"top:" + toPercent(anchor.y, entry.size.height) + "\"></i>\n";
         }
-        for (const PageLink& link : entry.links) {
+        for (const LinkArea& link : entry.links) {
             writeLink(entry, link);
         }
         html += "</section>\n";
     }
 
-    void writeLink(const IndexEntry& entry, const PageLink& link) {
+    void writeLink(const IndexEntry& entry, const LinkArea& link) {
         const std::string target = findTarget(entry, link.target);
         if (target.empty()) {
             return;

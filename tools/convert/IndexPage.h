@@ -19,7 +19,7 @@ struct IndexEntry {
     std::string file; ///< UTF-8, as a reference from the index
     int page = 0;     ///< counted from 0 in its document
     PageSize size;
-    std::vector<PageLink> links;
+    std::vector<LinkArea> links;
     std::vector<IndexAnchor> anchors;
 };
 

@@ -74,7 +74,7 @@ UnicodeString LinkWriter::findTarget(const PageLink& link) const {
     return (link.page == page ? UnicodeString() : targets.files[index]) + u"#" + id;
 }
 
-void LinkWriter::writeLinks(const std::vector<PageLink>& links) {
+void LinkWriter::writeLinks(const std::vector<PageLink>& links, PageReport& report) {
     for (const PageLink& link : links) {
         const UnicodeString target = findTarget(link);
         const fz_rect area = fz_translate_rect(link.area, shift.x, shift.y);
@@ -84,6 +84,9 @@ void LinkWriter::writeLinks(const std::vector<PageLink>& links) {
         canvas.beginLink(target, /*isNewWindow=*/false);
         canvas.fill(toPath(area), /*isEvenOdd=*/true, unseen);
         canvas.endLink();
+        std::string text;
+        report.links.push_back(
+            {area.x0, area.y0, area.x1 - area.x0, area.y1 - area.y0, target.toUTF8String(text)});
     }
 }
 

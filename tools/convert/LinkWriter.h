@@ -3,6 +3,7 @@
 
 #include "tools/convert/Canvas.h"
 #include "tools/convert/LinkReader.h"
+#include "tools/convert/PageReport.h"
 #include "tools/convert/PageTargets.h"
 
 #include <vector>
@@ -18,8 +19,9 @@ public:
     /// Writes what other links lead to.
     void writeDestinations();
 
-    /// Lays a transparent rectangle over each link that leads to something.
-    void writeLinks(const std::vector<PageLink>& links);
+    /// Lays a transparent rectangle over each link that leads to something, and notes it in the
+    /// report.
+    void writeLinks(const std::vector<PageLink>& links, PageReport& report);
 
 private:
     void writePoint(const LinkDestination& destination);

@@ -28,7 +28,7 @@ public:
         }
     }
 
-    void pass(const PageLink& link) {
+    void pass(const LinkArea& link) {
         pass(link.x);
         pass(link.y);
         pass(link.width);
@@ -65,7 +65,7 @@ public:
         }
     }
 
-    void pass(PageLink& link) {
+    void pass(LinkArea& link) {
         pass(link.x);
         pass(link.y);
         pass(link.width);

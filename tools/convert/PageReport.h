@@ -29,7 +29,7 @@ std::string describeApproximation(APPROXIMATION kind, int count);
 
 /// A link of the page, for what lies over pictures of pages. Units: points from the page's top
 /// left.
-struct PageLink {
+struct LinkArea {
     float x = 0;
     float y = 0;
     float width = 0;
@@ -49,7 +49,7 @@ struct PageReport {
     std::array<int, APPROXIMATION_COUNT> approximations{};
     bool isComplete = true;            ///< false when a part of the page is missing
     std::vector<std::string> messages; ///< errors and warnings of the parser, without repetitions
-    std::vector<PageLink> links;       ///< in the order in which they are drawn
+    std::vector<LinkArea> links;       ///< in the order in which they are drawn
 };
 
 } // namespace DrawmereConvert
