@@ -129,7 +129,7 @@ TEST_F(ProgramRun, NamesMayHoldAnything) {
     EXPECT_THAT(conversion.list("file:o"),
                 ElementsAre("a b#c%201.svg", "a b#c%202.svg", "index.html"));
     EXPECT_THAT(conversion.directory.read("file:o/index.html"),
-                HasSubstr("src=\"a%20b%23c%25202.svg\""));
+                HasSubstr("data-file=\"a%20b%23c%25202.svg\""));
 }
 
 TEST_F(ProgramRun, SeveralDocumentsShareAnIndex) {
@@ -171,6 +171,17 @@ TEST(Images, WordsChooseWhereTheyGo) {
     const std::string page = conversion.directory.read("copied/image-streams-small3.svg");
     EXPECT_THAT(page, Not(HasSubstr("data:")));
     EXPECT_THAT(page, HasSubstr("href=\"./image-streams-small3-1."));
+}
+
+// On purpose: linked, what lies in no file of its own is embedded.
+TEST(Images, LinkedWhatLiesInNoFileOfItsOwnIsEmbedded) {
+    const Conversion conversion;
+    const std::string input = Conversion::document("image-streams-small.pdf");
+    EXPECT_EQ(conversion.run({input, "-p", "3", "-o", "a.svg"}).status, 0);
+    EXPECT_EQ(conversion.run({input, "-p", "3", "-o", "b.svg", "--images", "link"}).status, 0);
+    EXPECT_EQ(conversion.directory.read("a.svg"), conversion.directory.read("b.svg"));
+    EXPECT_EQ(conversion.run({input, "-p", "3", "-o", "c.svg", "--images", "copy"}).status, 0);
+    EXPECT_EQ(conversion.list().size(), 4U); // the image among them
 }
 
 TEST(Images, ConversionResolutionAndQualityReachThem) {

@@ -69,7 +69,7 @@ public:
         if (hasOutline) {
             writeOutline();
         }
-        html += "<main>\n";
+        html += "<main tabindex=\"0\">\n";
         for (const IndexDocument& document : documents) {
             for (const IndexEntry& entry : document.entries) {
                 writePage(entry);
@@ -157,9 +157,8 @@ private:
     void writePage(const IndexEntry& entry) {
         const std::string number = std::to_string(numbers.at(entry.file));
         html += "<section id=\"p" + number + "\" style=\"--w:" + toText(entry.size.width) +
-                ";--h:" + toText(entry.size.height) + "\">\n<iframe src=\"" + escape(entry.file) +
-                "\" loading=\"lazy\" scrolling=\"no\" tabindex=\"-1\" title=\"Page " + number +
-                "\"></iframe>\n";
+                ";--h:" + toText(entry.size.height) + "\" data-file=\"" + escape(entry.file) +
+                "\">\n";
         for (const IndexAnchor& anchor : entry.anchors) {
             html += "<i id=\"p" + number + "." + escape(anchor.id) +
                     "\" style=\"top:" + toPercent(anchor.y, entry.size.height) + "\"></i>\n";

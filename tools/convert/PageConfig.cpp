@@ -4,11 +4,21 @@ namespace DrawmereConvert {
 
 using MoxCommonNS::MoxName;
 
+namespace {
+
+/// Returns: the library's word for what happens to images. Those inside a document lie in no file
+/// that a page could be linked to, so they are embedded then.
+MoxName findImageWord(const std::string& word) {
+    return MoxName(UnicodeString::fromUTF8(word == "link" ? "embed-all" : word));
+}
+
+} // namespace
+
 void fillConfig(SVGConfig& config, const RunOptions& options) {
     config.svgType = options.profile;
     config.gzip = options.gzip;
     config.saveOption = u"decimals=3";
-    config.setImageProcessingType(MoxName(UnicodeString::fromUTF8(options.images)));
+    config.setImageProcessingType(findImageWord(options.images));
     config.setImageConversion(MoxName(UnicodeString::fromUTF8(options.imageFormat)));
     config.downsampleDpi = options.dpi;
     config.jpegQuality = options.quality;
