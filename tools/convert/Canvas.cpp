@@ -73,17 +73,37 @@ void Canvas::stroke(const PathData& path, const Paint& paint, const Pen& pen) {
     }
     const fz_point& from = path.points[0];
     const fz_point& to = path.points[1];
+    countElement();
     out.drawLine(pt(from.x), pt(from.y), pt(to.x), pt(to.y), PAINTMODE_STROKE);
 }
 
 void Canvas::strokeWaiting(const Paint& paint, const Pen& pen) {
-    settings.setFill(waiting.paint);
-    settings.setStroke(paint, pen);
+    const int alpha = paint.color.getAlpha();
+    if (hidesFills && paint.color.hasAlpha() && waiting.paint.color.getAlpha() == alpha) {
+        Paint inside = waiting.paint;
+        Paint outline = paint;
+        inside.color.clearAlpha();
+        outline.color.clearAlpha();
+        settings.setOpacity(effects.opacity * static_cast<float>(alpha) / 255.0F);
+        settings.setFill(inside);
+        settings.setStroke(outline, pen);
+    } else {
+        settings.setFill(waiting.paint);
+        settings.setStroke(paint, pen);
+        elements += hidesFills ? 1 : 0; // the fill shows through, as that of another element would
+    }
     drawShape(waiting.path, waiting.isEvenOdd, PAINTMODE_FILLSTROKE);
+    settings.setOpacity(effects.opacity);
     waiting.path.clear();
 }
 
+void Canvas::setKnockout(bool isKnockout) {
+    flush();
+    hidesFills = isKnockout;
+}
+
 void Canvas::drawShape(const PathData& path, bool isEvenOdd, PAINTMODE mode) {
+    countElement();
     const bool isStroked = (mode & PAINTMODE_STROKE) != 0;
     fz_rect rect;
     // Dashes begin at the first corner, which a rectangle doesn't keep.

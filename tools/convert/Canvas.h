@@ -34,6 +34,10 @@ public:
 
     void stroke(const PathData& path, const Paint& paint, const Pen& pen);
 
+    /// Says whether an outline hides the fill under it, as in a knockout group: then both of a
+    /// shape share their opacity.
+    void setKnockout(bool isKnockout);
+
     /// Sets the effects of later shapes.
     void setEffects(const Effects& newEffects);
 
@@ -63,6 +67,12 @@ public:
     /// Draws the fill that waits.
     void flush();
 
+    /// Counts an element that was drawn through `out`.
+    void countElement() { ++elements; }
+
+    /// Returns: how many elements were drawn, without what only contains others.
+    std::int64_t getElementCount() const { return elements; }
+
     Drawmere& out;
 
     /// For calls to `out`: to be set through, after a flush.
@@ -84,6 +94,8 @@ private:
     void restoreDefinition();
 
     WaitingFill waiting;
+    std::int64_t elements = 0;
+    bool hidesFills = false;
     Effects effects;
     std::vector<Effects> savedEffects; // of the definitions around
 };

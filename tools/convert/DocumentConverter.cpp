@@ -16,6 +16,16 @@ namespace {
 
 PageSize getSize(const fz_rect& bounds) { return {bounds.x1 - bounds.x0, bounds.y1 - bounds.y0}; }
 
+constexpr std::int64_t maxElements = 1'000'000;
+
+bool usesOverprint(const DocumentFile& file) {
+    fz_context* ctx = file.ctx;
+    fz_page* page = file.page;
+    bool uses = false;
+    callFitz(ctx, [&] { uses = fz_page_uses_overprint(ctx, page) != 0; });
+    return uses;
+}
+
 /// Runs the page through a device. Returns: false when MuPDF gave it up.
 bool runPage(DocumentFile& file, PagePainter& painter, const fz_matrix& matrix) {
     fz_context* ctx = file.ctx;
@@ -116,6 +126,9 @@ PageReport DocumentConverter::drawPage(const PagePlace& place, const PageTargets
     PagePainter painter(file->ctx, options, *outlines, *fonts, report, drawmere,
                         {0, place.offset, size.width, bottom},
                         [&](GroupScan& scan) { scan.run(file->ctx, file->page, matrix); });
+    if (!place.isSingle) {
+        painter.clipToPage();
+    }
     report.isComplete = runPage(*file, painter, matrix);
     if (painter.failure) {
         std::rethrow_exception(painter.failure);
@@ -127,6 +140,12 @@ PageReport DocumentConverter::drawPage(const PagePlace& place, const PageTargets
     drawmere.endPage();
     report.isComplete = report.isComplete && file->cookie.errors == 0;
     report.messages = std::exchange(file->messages, {});
+    if (painter.canvas.getElementCount() > maxElements) {
+        report.messages.emplace_back("more than a million elements, which some viewers refuse");
+    }
+    if (usesOverprint(*file)) {
+        report.note(APPROXIMATION_OVERPRINT);
+    }
     return report;
 }
 

@@ -1,15 +1,21 @@
 #include "tools/convert/ImageWriter.h"
 
+#include "foundation/graphicservice/GS_Graphic.h"
 #include "foundation/records/TLMemoryImage.h"
 #include "tools/convert/ImagePixels.h"
 
 #include <algorithm>
 #include <cmath>
+#include <sstream>
+#include <utility>
 
 namespace DrawmereConvert {
 namespace {
 
+using namespace MoxGraphicService_NS; // NOLINT(google-build-using-namespace): many short names
 using TalGraphic::TLMemoryImage;
+
+constexpr float resolution = 72; // of images that state none
 
 constexpr float pixelsPerPoint = 96.0F / 72.0F;
 constexpr int maxZoom = 8;
@@ -30,6 +36,14 @@ int findZoom(const fz_image& image, const fz_matrix& matrix) {
     const double zoom = std::min(
         {std::ceil(static_cast<double>(size)), std::sqrt(room), static_cast<double>(maxZoom)});
     return std::max(1, static_cast<int>(zoom));
+}
+
+bool isWantedAsJpeg(const MoxName& conversion, GS_RasterImage& image) {
+    if (conversion == MoxName(u"png") || conversion == MoxName(u"png-all")) {
+        return false;
+    }
+    return conversion == MoxName(u"jpg") || conversion == MoxName(u"jpg-all") ||
+           image.getImageClass() == IMAGECLASS_PHOTOGRAPH;
 }
 
 UnicodeString getExtension(const std::string& bytes) {
@@ -63,7 +77,7 @@ void ImageWriter::drawPixels(const ImagePixels& pixels, const fz_matrix& matrix,
     ImageLook look;
     look.isWhite = use == COLORUSE_ALPHA;
     look.isGray = use == COLORUSE_LUMINOSITY;
-    ImageFile file{encodeImage(pixels, look), {}};
+    ImageFile file{packBitmap(encodeImage(pixels, look)), {}};
     file.name = makeName(file.bytes);
     place(file, matrix, alpha);
 }
@@ -73,7 +87,7 @@ const ImageWriter::ImageFile& ImageWriter::findFile(const ImageKey& key) {
     if (isNew) {
         fz_keep_image(ctx, key.image);
         fz_keep_image(ctx, key.mask);
-        entry->second.bytes = makeBytes(key);
+        entry->second.bytes = packBitmap(makeBytes(key));
         entry->second.name = makeName(entry->second.bytes);
     }
     return entry->second;
@@ -106,6 +120,29 @@ std::string ImageWriter::decode(const ImageKey& key) {
         look.mask = &mask;
     }
     return encodeImage(pixels, look);
+}
+
+// How large the file of a bitmap becomes decides where it goes, so that of a large one is made
+// here, in the form that the library would choose.
+std::string ImageWriter::packBitmap(std::string bytes) {
+    const SVGConfig& config = *canvas.out.config;
+    if (!bytes.starts_with("BM")) {
+        return bytes;
+    }
+    report.note(APPROXIMATION_IMAGE);
+    if (bytes.size() <= options.maxInlineBytes || config.downsampleDpi > 0) {
+        return bytes;
+    }
+    std::istringstream source(bytes);
+    std::ostringstream target;
+    const GS_Graphic bitmap(source, resolution);
+    if (!bitmap.raster) {
+        return bytes;
+    }
+    const bool isJpeg = isWantedAsJpeg(config.imageConversionName, *bitmap.raster);
+    bitmap.raster->writeToStream(target, isJpeg ? CONVERT_BMP_JPEG : CONVERT_BMP_PNG,
+                                 config.jpegQuality);
+    return bitmap.raster->getFailure() == FAILURE_NONE ? std::move(target).str() : bytes;
 }
 
 // The same bytes have the same name everywhere, so that files beside the pages are written once.
@@ -152,10 +189,12 @@ void ImageWriter::drawUnit(const ImageFile& file, float width, float height, flo
     TLMemoryImage image(file.bytes, file.name);
     SVGConfig& config = *canvas.out.config;
     const MoxName chosen = config.imageProcessingName;
-    const bool isLarge = file.bytes.size() > options.maxInlineBytes && !config.streamOutput;
+    const bool isLarge = file.bytes.size() > options.maxInlineBytes && !config.streamOutput &&
+                         !file.bytes.starts_with("BM");
     if (isLarge) {
         config.setImageProcessingType(MoxName(u"copy"));
     }
+    canvas.countElement();
     canvas.out.drawImage(&image, image.getGraphicType(), pt(width), pt(height), pt(x), pt(y));
     if (isLarge) {
         config.setImageProcessingType(chosen);

@@ -56,6 +56,7 @@ private:
     const ImageFile& findFile(const ImageKey& key);
     std::string makeBytes(const ImageKey& key);
     std::string decode(const ImageKey& key);
+    std::string packBitmap(std::string bytes);
     UnicodeString makeName(const std::string& bytes);
     void place(const ImageFile& file, const fz_matrix& matrix, float alpha);
     void drawUnit(const ImageFile& file, float width, float height, float x, float y);

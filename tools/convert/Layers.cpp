@@ -341,6 +341,8 @@ void Layers::fillClip(const fz_rect& bounds, const Paint& paint) {
     }
 }
 
+void Layers::clipToPage() { clips().push(toPath(clips().getVisible()), /*isEvenOdd=*/true); }
+
 void Layers::finish() {
     while (!openings.empty()) {
         pop();

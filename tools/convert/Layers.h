@@ -85,6 +85,9 @@ public:
         return fz_transform_rect(area, scopes.back()->matrix);
     }
 
+    /// Cuts everything off at the edges of the page.
+    void clipToPage();
+
     /// Closes everything.
     void finish();
 

@@ -284,10 +284,23 @@ void PagePainter::beginGroup(const fz_rect& area, bool isKnockout, int blendMode
     if (blendMode != FZ_BLEND_NORMAL) {
         report.note(APPROXIMATION_BLEND);
     }
-    if (isKnockout) {
+    layers.beginGroup(layers.placeArea(area), alpha);
+    canvas.setKnockout(isKnockout);
+    groups.push_back({isKnockout, canvas.getElementCount()});
+}
+
+// A single element, be it filled and stroked, has nothing to hide but itself.
+void PagePainter::endGroup() {
+    if (groups.empty()) {
+        return;
+    }
+    const OpenGroup group = groups.back();
+    groups.pop_back();
+    canvas.setKnockout(!groups.empty() && groups.back().isKnockout);
+    if (group.isKnockout && canvas.getElementCount() > group.firstElement + 1) {
         report.note(APPROXIMATION_KNOCKOUT);
     }
-    layers.beginGroup(layers.placeArea(area), alpha);
+    layers.pop();
 }
 
 void PagePainter::beginTile(const fz_rect& area, const fz_rect& cell, float xStep, float yStep,

@@ -57,12 +57,15 @@ public:
 
     void beginGroup(const fz_rect& area, bool isKnockout, int blendMode, float alpha);
 
-    void endGroup() { layers.pop(); }
+    void endGroup();
 
     void beginTile(const fz_rect& area, const fz_rect& cell, float xStep, float yStep,
                    const fz_matrix& matrix);
 
     void endTile() { layers.endTile(); }
+
+    /// For a page that is not all of its document.
+    void clipToPage() { layers.clipToPage(); }
 
     /// Draws what waits; to be called at the end of the page.
     void finish() { layers.finish(); }
@@ -85,6 +88,12 @@ private:
     bool traceMask(fz_image* image, const fz_matrix& matrix);
     void fillBackground(const fz_shade& shade, const fz_rect& area, float alpha);
 
+    /// A group that is open.
+    struct OpenGroup {
+        bool isKnockout = false;
+        std::int64_t firstElement = 0;
+    };
+
     fz_context* ctx;
     PageReport& report;
     const ConvertOptions& options;
@@ -94,6 +103,7 @@ private:
     ImageWriter images;
     ShadingWriter shadings;
     Layers layers;
+    std::vector<OpenGroup> groups;
     PathData current; // kept for its memory
 };
 

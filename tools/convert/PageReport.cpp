@@ -20,7 +20,6 @@ constexpr std::array<ApproximationWords, APPROXIMATION_COUNT> approximationWords
     {"pattern with overlapping cells cut", "patterns with overlapping cells cut"},
     {"image written in another form", "images written in another form"},
     {"text drawn as outlines", "texts drawn as outlines"},
-    {"font not embedded", "fonts not embedded"},
     {"clip or group too deep", "clips or groups too deep"},
 }};
 

@@ -19,7 +19,6 @@ enum APPROXIMATION : std::int32_t {
     APPROXIMATION_PATTERN,   ///< a tiling pattern whose cells overlap, drawn cut off
     APPROXIMATION_IMAGE,     ///< an image decoded and written in another form
     APPROXIMATION_TEXT,      ///< text drawn as outlines though the mode asks for text
-    APPROXIMATION_FONT,      ///< a font that can't be embedded, replaced by its name
     APPROXIMATION_DEPTH,     ///< a clip or group left out where elements nest too deep
     APPROXIMATION_COUNT,
 };

@@ -164,6 +164,7 @@ void TextWriter::flushLine(const TextSpan& span, const TextPaint& paint) {
     setPaint(paint);
     canvas.out.setFont(&font, file);
     TalFont::TLStringWithGlyphInfo glyphs(line.glyphs);
+    canvas.countElement();
     canvas.out.drawText(line.text, x, {pt(line.y)}, {}, paint.mode, &glyphs, /*wholeRun=*/false,
                         /*leftToRight=*/true);
     line = Line();
