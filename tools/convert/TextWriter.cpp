@@ -41,6 +41,21 @@ void appendGlyph(std::u16string& text, int character, int glyph) {
     append(text, isShown(character) ? character : firstPrivate + glyph % privateCount);
 }
 
+/// Returns: whether the character belongs to a script that runs from right to left.
+bool isRightToLeft(int character) {
+    return (character >= 0x590 && character < 0x900) ||
+           (character >= 0xFB1D && character < 0xFE00) ||
+           (character >= 0xFE70 && character < 0xFF00);
+}
+
+/// Returns: whether the glyph goes along with the script around it: blanks, marks, and glyphs of
+/// which nobody knows what they are.
+bool isNeutral(const TextSpan::Cluster& cluster) {
+    const char16_t character = cluster.text.front();
+    return cluster.isRightToLeft || (character >= 0x20 && character < 0x30) || character == 0xA0 ||
+           (character >= firstPrivate && character < firstPrivate + privateCount);
+}
+
 bool isClose(const fz_matrix& one, const fz_matrix& other) {
     constexpr float limit = 1e-4F;
     return std::abs(one.a - other.a) < limit && std::abs(one.b - other.b) < limit &&
@@ -66,6 +81,12 @@ TextSpan::TextSpan(const fz_text_span& span, const fz_matrix& matrix, TextFont& 
     isTurned = !isClose(turn, fz_identity);
     const fz_matrix back = isTurned ? fz_invert_matrix(turn) : fz_identity;
     turn = isTurned ? turn : fz_identity;
+    read(span, matrix, back);
+    orderRightToLeft();
+}
+
+void TextSpan::read(const fz_text_span& span, const fz_matrix& matrix, const fz_matrix& back) {
+    clusters.reserve(static_cast<std::size_t>(span.len));
     for (int i = 0; i < span.len; ++i) {
         const fz_text_item& item = span.items[i];
         if (item.gid < 0) {
@@ -79,6 +100,26 @@ TextSpan::TextSpan(const fz_text_span& span, const fz_matrix& matrix, TextFont& 
         cluster.glyph = item.gid;
         cluster.at = fz_transform_point(fz_transform_point_xy(item.x, item.y, matrix), back);
         cluster.advance = font.getAdvance(item.gid) * size;
+        cluster.isRightToLeft = isRightToLeft(item.ucs);
+    }
+}
+
+// Many documents hold such text in the order of the page, from left to right. What a reader copies
+// is to be in the order of speech.
+void TextSpan::orderRightToLeft() {
+    const auto isStrong = [](const Cluster& cluster) { return cluster.isRightToLeft; };
+    auto first = std::ranges::find_if(clusters, isStrong);
+    while (first != clusters.end()) {
+        auto last = first;
+        for (auto next = first + 1; next != clusters.end() && isNeutral(*next) &&
+                                    std::abs(next->at.y - first->at.y) < closeEnough;
+             ++next) {
+            last = next->isRightToLeft ? next : last;
+        }
+        if (last->at.x > first->at.x) {
+            std::reverse(first, last + 1);
+        }
+        first = std::find_if(last + 1, clusters.end(), isStrong);
     }
 }
 
@@ -131,7 +172,10 @@ bool TextWriter::startsLine(const TextSpan::Cluster& cluster, int variant) const
 void TextWriter::add(const TextSpan::Cluster& cluster) {
     const std::size_t count = cluster.text.size();
     const float x = toHundredth(cluster.at.x);
-    const bool follows = mode == TEXTMODE_FONTS && !line.x.empty() &&
+    // What follows by itself is put in order by the viewer, where there is another direction.
+    const bool isOrdered = cluster.isRightToLeft || line.endsRightToLeft;
+    line.endsRightToLeft = cluster.isRightToLeft;
+    const bool follows = mode == TEXTMODE_FONTS && !line.x.empty() && !isOrdered &&
                          std::abs(line.next - cluster.at.x) <= closeEnough;
     // In a font of the viewer the characters of a ligature share its room.
     const float step = cluster.advance / static_cast<float>(count);

@@ -40,6 +40,7 @@ public:
         int glyph = 0;
         fz_point at{};
         float advance = 0; ///< in points
+        bool isRightToLeft = false;
     };
 
     TextFont& font;
@@ -47,6 +48,10 @@ public:
     fz_matrix turn = fz_identity; ///< does not change sizes
     bool isTurned = false;
     std::vector<Cluster> clusters;
+
+private:
+    void read(const fz_text_span& span, const fz_matrix& matrix, const fz_matrix& back);
+    void orderRightToLeft();
 };
 
 /// Writes spans as text elements, as few as put every glyph where it belongs.
@@ -64,6 +69,7 @@ private:
         std::vector<float> x;   // one for each character
         std::size_t placed = 0; // how many need one; the others follow by themselves
         float next = 0;         // where a character is that follows by itself
+        bool endsRightToLeft = false;
         std::vector<TalFont::TLGlyphEntry> glyphs;
         float y = 0;
         int variant = 0;
