@@ -28,13 +28,11 @@ struct LibraryOwner {
 };
 
 constexpr LibraryOwner libraryOwners[] = {
-    {"fontconfig/", "foundation/"},  {"freetype/", "foundation/"},
-    {"ft2build.h", "foundation/"},   {"gif_lib.h", "foundation/"},
-    {"harfbuzz/", "foundation/"},    {"hb", "foundation/"},
-    {"jpeglib.h", "foundation/"},    {"png.h", "foundation/"},
-    {"stb", "foundation/"},          {"tiff", "foundation/"},
-    {"turbojpeg.h", "foundation/"},  {"uriparser/", "foundation/"},
-    {"webp/", "foundation/"},        {"zconf.h", "config/SVGZip.cpp"},
+    {"fontconfig/", "foundation/"},  {"freetype/", "foundation/"}, {"ft2build.h", "foundation/"},
+    {"gif_lib.h", "foundation/"},    {"harfbuzz/", "foundation/"}, {"hb", "foundation/"},
+    {"jerror.h", "foundation/"},     {"jpeglib.h", "foundation/"}, {"png.h", "foundation/"},
+    {"stb", "foundation/"},          {"tiff", "foundation/"},      {"turbojpeg.h", "foundation/"},
+    {"uriparser/", "foundation/"},   {"webp/", "foundation/"},     {"zconf.h", "config/SVGZip.cpp"},
     {"zlib.h", "config/SVGZip.cpp"},
 };
 
