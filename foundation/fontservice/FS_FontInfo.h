@@ -1,6 +1,7 @@
 /// A handle on one face of one font.
 #pragma once
 
+#include "DrawmereExport.h"
 #include "foundation/common/MoxLang.h"
 #include "foundation/common/MoxString.h"
 #include "foundation/fontservice/FS_ExtraFonts.h"
@@ -21,7 +22,7 @@ struct FS_FoundFace;
 /// nothing is said, weight 400, upright, no family name, no glyph, a width of 0. Faces are shared
 /// by all handles of the process, on any thread; a handle that nobody changes may be used by
 /// several. Copies share the face.
-class FS_FontInfo {
+class DRAWMERE_API FS_FontInfo {
 public:
     static constexpr unsigned short noGlyph = 65535;
 
