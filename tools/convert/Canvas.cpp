@@ -118,22 +118,34 @@ void Canvas::drawShape(const PathData& path, bool isEvenOdd, PAINTMODE mode) {
 }
 
 void Canvas::drawPath(const PathData& path, PAINTMODE mode) {
+    const bool isStroked = (mode & PAINTMODE_STROKE) != 0;
+    const std::size_t count = path.steps.size();
     out.startPathData();
     const fz_point* point = path.points.data();
-    for (const PATHSTEP step : path.steps) {
-        switch (step) {
+    const fz_point* start = point;
+    for (std::size_t i = 0; i < count; ++i) {
+        const bool isLast = i + 1 == count || path.steps[i + 1] == PATHSTEP_MOVE;
+        const bool closes = i + 1 < count && path.steps[i + 1] == PATHSTEP_CLOSE;
+        switch (path.steps[i]) {
         case PATHSTEP_MOVE:
+            start = point;
             out.setPathMoveTo(place(*point++));
             break;
         case PATHSTEP_LINE:
-            out.setPathLineTo(place(*point++));
+            // What closes goes back by itself.
+            if (!closes || point->x != start->x || point->y != start->y) {
+                out.setPathLineTo(place(*point));
+            }
+            ++point;
             break;
         case PATHSTEP_CURVE:
             out.setPathCubicBezierCurveTo(place(point[0]), place(point[1]), place(point[2]));
             point += 3;
             break;
         case PATHSTEP_CLOSE:
-            out.setPathClosepath();
+            if (isStroked || !isLast) { // a fill closes by itself
+                out.setPathClosepath();
+            }
             break;
         }
     }
