@@ -124,10 +124,13 @@ void SVGTreeManager::stampContext(SVGElement* element) {
 }
 
 void SVGTreeManager::appendNewGroup(SVGElement* group, bool makeCurrent) {
-    if (!canAdd() || !group) {
+    if (!group) {
         return;
     }
-    clipGroups.emplace_back(group);
+    clipGroups.emplace_back(group); // under the lock too: it may stand in an open group already
+    if (!canAdd()) {
+        return;
+    }
     if (makeCurrent) {
         currentNode->appendChild(group);
     }

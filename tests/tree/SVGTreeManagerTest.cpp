@@ -272,6 +272,14 @@ TEST_F(SVGTreeManagerTest, AnEmptyGroupIsAClippingOneThatNothingWentInto) {
     EXPECT_TRUE(tree.hasEmptyGroup());
 }
 
+TEST_F(SVGTreeManagerTest, AGroupThatCameUnderTheStopLockMayStandInTheTreeAndCountsToo) {
+    const MoxPtr<SVGElement> group = make(SVGName::g);
+    root->appendChild(group.get());
+    tree.setupStopLock();
+    tree.appendNewGroup(group.get(), false);
+    EXPECT_TRUE(tree.hasEmptyGroup());
+}
+
 TEST_F(SVGTreeManagerTest, ANewGroupNeedsNoContext) {
     const MoxPtr<SVGElement> group = make(SVGName::g);
     tree.appendNewGroup(group.get(), true);
