@@ -21,9 +21,12 @@ std::int32_t findExtension(const UnicodeString& name) {
     return index < 0 ? name.length() : index;
 }
 
-bool isDirectory(const MoxCStr& path) {
+/// A directory opens for reading, and fails only later; a pipe may keep its opener waiting for
+/// ever.
+bool isDirectoryOrPipe(const MoxCStr& path) {
     std::error_code failure;
-    return std::filesystem::is_directory(path.toBytes(), failure);
+    const std::filesystem::file_status status = std::filesystem::status(path.toBytes(), failure);
+    return std::filesystem::is_directory(status) || std::filesystem::is_fifo(status);
 }
 
 } // namespace
@@ -136,8 +139,7 @@ std::istream* MoxUri::getIStream(ContentInfo*, UnicodeString* type) const {
         type->remove();
     }
     UnicodeString path;
-    // A directory opens for reading, and fails only later.
-    if (!readLocalFile(path) || isDirectory(path)) {
+    if (!readLocalFile(path) || isDirectoryOrPipe(path)) {
         return nullptr;
     }
     auto stream =

@@ -93,7 +93,7 @@ public:
     /// Shape: both arguments may be null; `info` is left alone, `type` is emptied, as a file
     /// doesn't tell its media type.
     /// Owns: the caller deletes the stream.
-    /// Returns: null on failure, for a directory and for what is no local file.
+    /// Returns: null on failure, for a directory, a pipe and what is no local file.
     std::istream* getIStream(ContentInfo* info, UnicodeString* type) const;
 
 private:

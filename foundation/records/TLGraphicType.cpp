@@ -1,5 +1,6 @@
 #include "foundation/records/TLGraphicType.h"
 
+#include <algorithm>
 #include <istream>
 #include <string_view>
 
@@ -18,6 +19,22 @@ constexpr Signature signatures[] = {
 
 constexpr std::size_t headSize = 1024;
 
+/// Reads the first bytes of a stream, whose state stays as it is, and goes back to the first.
+/// Returns: how many there were, none when the stream can't be repositioned.
+std::size_t readHead(std::istream& source, char* bytes) {
+    std::streambuf* const buffer = source.rdbuf();
+    try {
+        if (!buffer || buffer->pubseekpos(0, std::ios::in) != std::streampos(0)) {
+            return 0;
+        }
+        const std::streamsize count = buffer->sgetn(bytes, headSize);
+        buffer->pubseekpos(0, std::ios::in);
+        return static_cast<std::size_t>(std::max<std::streamsize>(count, 0));
+    } catch (...) {
+        return 0; // a directory that was opened as a file, for instance
+    }
+}
+
 /// Returns: whether the text is markup whose root may be `svg`.
 bool isSvg(std::string_view head) {
     constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
@@ -33,13 +50,7 @@ bool isSvg(std::string_view head) {
 
 TLGraphicType findGraphicType(std::istream& source) {
     char bytes[headSize];
-    std::streambuf* const buffer = source.rdbuf(); // the state of the stream stays as it is
-    if (!buffer || buffer->pubseekpos(0, std::ios::in) != std::streampos(0)) {
-        return TLGRAPHICTYPE_OTHER;
-    }
-    const std::streamsize count = buffer->sgetn(bytes, headSize);
-    buffer->pubseekpos(0, std::ios::in);
-    const std::string_view head(bytes, static_cast<std::size_t>(count > 0 ? count : 0));
+    const std::string_view head(bytes, readHead(source, bytes));
     for (const Signature& signature : signatures) {
         if (head.starts_with(signature.bytes)) {
             return signature.type;

@@ -8,6 +8,7 @@
 #include <memory>
 #include <string>
 
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <gtest/gtest.h>
@@ -404,6 +405,11 @@ TEST_F(MoxUriFiles, ReadingLeavesNoMediaType) {
     const std::unique_ptr<std::istream> stream(uri(path(u"x.svg")).getIStream(nullptr, &type));
     EXPECT_NE(stream, nullptr);
     EXPECT_TRUE(type.isEmpty());
+}
+
+TEST_F(MoxUriFiles, PipeIsNotWaitedFor) {
+    ASSERT_EQ(mkfifo((directory / "pipe").c_str(), S_IRWXU), 0);
+    EXPECT_EQ(read(path(u"pipe")), "null");
 }
 
 TEST_F(MoxUriFiles, OverlongPathIsAFailureLikeAnyOther) {

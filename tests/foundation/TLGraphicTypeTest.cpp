@@ -1,11 +1,14 @@
 #include "foundation/records/TLGraphicType.h"
 
+#include "tests/support/BrittleBuffer.h"
+
 #include <sstream>
 #include <string>
 
 #include <gtest/gtest.h>
 
 using namespace TalGraphic;
+using DrawmereTest::BrittleBuffer;
 
 namespace {
 
@@ -52,6 +55,11 @@ TEST(TLGraphicType, AStreamAtItsEndIsReadAllTheSame) {
 TEST(TLGraphicType, AStreamThatCannotBeReadHasNoType) {
     std::istream broken(nullptr);
     EXPECT_EQ(findGraphicType(broken), TLGRAPHICTYPE_OTHER);
+    for (const BrittleBuffer::Fault fault : BrittleBuffer::faults) {
+        BrittleBuffer buffer("\xFF\xD8\xFF", 1, fault);
+        std::istream stream(&buffer);
+        EXPECT_EQ(findGraphicType(stream), TLGRAPHICTYPE_OTHER) << fault;
+    }
 }
 
 TEST(TLGraphicType, TypesHaveTheNumbersOfTheCallers) {
