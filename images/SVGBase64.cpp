@@ -26,10 +26,13 @@ struct FileCloser {
 
 using File = std::unique_ptr<std::FILE, FileCloser>;
 
-/// Opens a file that is no directory; one of these could be opened too, but not be read.
+/// Opens a file that is neither a directory, which could be opened too but not be read, nor a pipe,
+/// which may keep its opener waiting for ever.
 File openSource(const char* path) {
     std::error_code failure;
-    if (!path || std::filesystem::is_directory(path, failure)) {
+    const auto status =
+        path ? std::filesystem::status(path, failure) : std::filesystem::file_status();
+    if (!path || std::filesystem::is_directory(status) || std::filesystem::is_fifo(status)) {
         return nullptr;
     }
     return File(std::fopen(path, "rb"));

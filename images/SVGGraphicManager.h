@@ -103,7 +103,7 @@ public:
 
     /// Places an image whose bytes become part of the document, once for all uses of one file
     /// name: the first use decides the pixels. The cursor of the tree stays in `defs` until the
-    /// next pop, so the caller wraps the call in a push and a pop.
+    /// next pop, so the caller wraps the call in a push and a pop. Ignores: an image in a gradient.
     /// Queues: 16417 and 16420, for what can't be read. Throws: MoxError 16405 when the text would
     /// be too large.
     void embedGraphic(TLGraphicImage* image, MoxLength width, MoxLength height, MoxLength x,

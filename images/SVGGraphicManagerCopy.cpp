@@ -53,6 +53,11 @@ UnicodeString getStem(const UnicodeString& fileName) {
     return uri.getFileName();
 }
 
+/// Returns: the number behind `counter`; the first one follows the last.
+std::int32_t getNext(std::int32_t counter) {
+    return static_cast<std::int32_t>(static_cast<std::uint32_t>(counter) + 1U);
+}
+
 /// All bytes of a stream.
 struct Bytes {
     std::unique_ptr<char[]> data;
@@ -90,11 +95,11 @@ UnicodeString SVGGraphicManager::makeCopyName(TLGraphicImage* image, const MoxUr
     const UnicodeString prefix = isCounted ? config->copyNamePrefix : stem;
     const UnicodeString ending =
         extension.isEmpty() ? chooseExtension(image->getGraphicType()) : extension;
-    std::int32_t counter = isCounted ? config->copyNameCounter + 1 : 0;
+    std::int32_t counter = isCounted ? getNext(config->copyNameCounter) : 0;
     UnicodeString name =
         prefix + (isCounted ? MoxUtil::toString(counter) : UnicodeString()) + ending;
     while (config->isEnteredImagename(name)) {
-        ++counter;
+        counter = getNext(counter);
         name = prefix + MoxUtil::toString(counter) + ending;
     }
     config->enterImageName(stem, orgName, name);
@@ -167,6 +172,10 @@ UnicodeString SVGGraphicManager::convertImage(TLGraphicImage* image, const MoxUr
 
 void SVGGraphicManager::writeConverted(GS_RasterImage& raster, const UnicodeString& path,
                                        IMAGE_CONVERT_TYPE type) const {
+    if (path.indexOf(u'\0') >= 0) { // it would end the path early and name some other file
+        report(copyError, path);
+        return;
+    }
     raster.writeToFile(MoxCStr(path).toCStr(), type, config->jpegQuality);
     if (raster.getFailure() == FAILURE_SOURCE) {
         report(loadError);

@@ -133,6 +133,11 @@ void SVGGraphicManager::embedGraphic(TLGraphicImage* image, MoxLength width, Mox
     if (!isUsable(graphic)) {
         return;
     }
+    // A gradient is open, which takes no image. Storing one would move the cursor out of it, and
+    // each later use of the image would lead nowhere.
+    if (!treeManager->unlocked) {
+        return;
+    }
     imageParent = treeManager->getCurrentNode();
     const UnicodeString name = image->getOrgFileName();
     const auto known = name.isEmpty() ? embeddedImages.end() : embeddedImages.find(name);

@@ -7,7 +7,7 @@
 namespace DrawmereNS {
 
 /// Reads streams by their buffers: an earlier reader may have met the end and left its mark in the
-/// state of the stream, and a stream that throws on failure must not end the run.
+/// state of the stream. A stream or a buffer that throws on failure must not end the run.
 class SVGImageBytes {
 public:
     SVGImageBytes() = delete;
@@ -15,7 +15,8 @@ public:
     /// Goes to the first byte. Returns: the count of bytes, -1 when the stream can't tell.
     static std::streamoff start(std::istream& source);
 
-    /// Returns: how many of the next `count` bytes there were; they stand in `bytes`.
+    /// Returns: how many of the next `count` bytes there were; they stand in `bytes`. 0 when
+    /// the buffer throws.
     static std::size_t read(std::istream& source, char* bytes, std::size_t count);
 };
 

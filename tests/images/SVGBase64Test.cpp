@@ -7,6 +7,8 @@
 #include <climits>
 #include <sstream>
 
+#include <sys/stat.h>
+
 namespace DrawmereTest {
 namespace {
 
@@ -218,6 +220,16 @@ TEST(SVGBase64, AFileIsNotEncodedIntoItself) {
     EXPECT_EQ(SVGBase64::EncodeFile(directory.path("in").c_str(), directory.path("./in").c_str()),
               -19);
     EXPECT_EQ(directory.read("in"), "abc");
+}
+
+TEST(SVGBase64, APipeIsNotWaitedFor) {
+    const TempDir directory;
+    const std::string pipe = directory.path("pipe");
+    ASSERT_EQ(mkfifo(pipe.c_str(), S_IRWXU), 0);
+    char out[10] = {};
+    EXPECT_EQ(SVGBase64::CreateMatchingEncodingBuffer(pipe.c_str(), BASE64INPUTTYPE_FILE), -20);
+    EXPECT_EQ(SVGBase64::encodeFile2Buffer(pipe.c_str(), out, sizeof(out)), -20);
+    EXPECT_EQ(SVGBase64::EncodeFile(pipe.c_str(), directory.path("out").c_str()), -20);
 }
 
 TEST(SVGBase64, AFullDiskIsTold) {

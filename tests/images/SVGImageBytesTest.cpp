@@ -1,5 +1,7 @@
 #include "images/SVGImageBytes.h"
 
+#include "tests/support/BrittleBuffer.h"
+
 #include <sstream>
 #include <string>
 
@@ -39,6 +41,23 @@ TEST(SVGImageBytes, StreamThatCannotTellItsLengthIsKnown) {
     EXPECT_EQ(readAll(broken, 10), "");
     std::istringstream empty;
     EXPECT_EQ(SVGImageBytes::start(empty), 0);
+}
+
+TEST(SVGImageBytes, BufferThatThrowsHasNoBytes) {
+    BrittleBuffer unsought("bytes", 5, BrittleBuffer::THROWS_WHEN_SOUGHT);
+    std::istream first(&unsought);
+    EXPECT_EQ(SVGImageBytes::start(first), -1);
+    BrittleBuffer unread("bytes", 3, BrittleBuffer::THROWS);
+    std::istream second(&unread);
+    EXPECT_EQ(SVGImageBytes::start(second), 5);
+    EXPECT_EQ(readAll(second, 3), "byt");
+    EXPECT_EQ(readAll(second, 2), "");
+}
+
+TEST(SVGImageBytes, BufferThatCannotBeRepositionedHasNoLength) {
+    BrittleBuffer buffer("bytes", 5, BrittleBuffer::REFUSES_TO_SEEK);
+    std::istream stream(&buffer);
+    EXPECT_EQ(SVGImageBytes::start(stream), -1);
 }
 
 } // namespace
