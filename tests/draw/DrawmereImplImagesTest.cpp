@@ -196,6 +196,24 @@ TEST(DrawmereImplImages, MissingDirectoryEndsTheRun) {
     }
 }
 
+/// An implementation with copies of its own.
+class CopyingImpl : public SVGFullImpl {
+public:
+    using SVGFullImpl::SVGFullImpl;
+
+    UnicodeString copyImage(TLGraphicImage* /*image*/) override { return u"own/copy.png"; }
+};
+
+TEST(DrawmereImplImages, AnImplementationMayCopyInItsOwnWay) {
+    DrawnTree<CopyingImpl> tree;
+    tree.config.setImageProcessingType(MoxName(u"copy"));
+    tree.config.imageCopyUri = u"img";
+    TypedImage image(2, "bytes", u"in/a.png");
+    tree.impl.drawImage(&image, pt(1), pt(1), pt(1), pt(1));
+    tree.impl.finishRootSvg();
+    EXPECT_THAT(tree.content(), HasSubstr("xlink:href=\"img/copy.png\""));
+}
+
 // Misuse.
 
 TEST(DrawmereImplImages, NullImageIsIgnored) {

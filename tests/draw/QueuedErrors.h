@@ -10,16 +10,19 @@ namespace DrawmereTest {
 
 using namespace DrawmereNS;
 
-/// Returns: number and text of each queued error, one a line, with " at" behind one that tells a
-/// place or anything more; the queue is empty then.
+/// Returns: number and text of an error, with " at" behind one that tells a place or anything more.
+inline std::string describe(const MoxError& error) {
+    const bool tellsMore = !error.getSource().isEmpty() || !error.getExtra().isEmpty() ||
+                           error.getLine() != -1 || error.getColumn() != -1;
+    return std::to_string(error.getCode()) + " " + utf8(error.getMessage()) +
+           (tellsMore ? " at" : "");
+}
+
+/// Returns: each queued error, the newest first and one a line; the queue is empty then.
 inline std::string takeErrors(SVGConfig& config) {
     std::string lines;
     while (config.hasError()) {
-        const MoxError error = config.popError();
-        const bool tellsMore = !error.getSource().isEmpty() || !error.getExtra().isEmpty() ||
-                               error.getLine() != -1 || error.getColumn() != -1;
-        lines += std::to_string(error.getCode()) + " " + utf8(error.getMessage()) +
-                 (tellsMore ? " at\n" : "\n");
+        lines += describe(config.popError()) + "\n";
     }
     return lines;
 }

@@ -7,6 +7,7 @@
 #include "state/SVGGraphicContext.h"
 #include "state/SVGGroupManager.h"
 #include "tests/draw/DrawnTree.h"
+#include "tests/draw/QueuedErrors.h"
 #include "tests/support/TempDir.h"
 #include "tests/support/TinyImages.h"
 #include "tree/SVGTreeManager.h"
@@ -62,11 +63,11 @@ struct ImagePage : DrawnTree<> {
         impl.popState(ELEMENT_TYPE_PLAIN);
     }
 
-    /// Returns: the errors that wait, the oldest first, each as its code and its message.
+    /// Returns: the errors that wait, the oldest first.
     std::vector<std::string> errors() {
         std::vector<std::string> texts;
         for (const MoxError& error : config.errors) {
-            texts.push_back(std::to_string(error.getCode()) + " " + utf8(error.getMessage()));
+            texts.push_back(describe(error));
         }
         return texts;
     }

@@ -398,6 +398,54 @@ TEST(SVGGraphicManagerEmbed, ScaleOfTheStateEnlargesThePlace) {
     EXPECT_EQ(raster.xResolution, 72.0);
 }
 
+// Any other order of the factors, and any other precision, gives other numbers here.
+
+TEST(SVGGraphicManagerEmbed, PixelsOfThePlaceAreCountedInTheOrderOfTheFactors) {
+    ImagePage page;
+    page.config.downsampleDpi = 150;
+    page.config.downsampleThreshold = 0;
+    page.impl.setScale(1.3F);
+    FakeRaster raster(RASTERKIND_PNG, 5000, 5000);
+    EXPECT_TRUE(page.manager().execDownsample(&raster, MoxLength(10.1F, MoxCommonNS::MOXUNIT_INCH),
+                                              MoxLength(10.1F, MoxCommonNS::MOXUNIT_INCH)));
+    EXPECT_EQ(raster.targetColumns, 1969);
+    EXPECT_EQ(raster.targetRows, 1969);
+}
+
+TEST(SVGGraphicManagerEmbed, SidesAreMultipliedBeforeTheyAreDivided) {
+    const SizeRow rows[] = {
+        {1, 3089, 4667, 3657, 5000, 5000, 3089, 2421}, // the limit for a wide image
+        {1, 3089, 3657, 4667, 5000, 5000, 2421, 3089}, // for a high one
+        {1, 0, 4667, 3657, 3089, 5000, 3089, 2421},    // the pixels there are, in width
+        {1, 0, 3657, 4667, 5000, 3089, 2421, 3089},    // in height
+    };
+    for (const SizeRow& row : rows) {
+        ImagePage page;
+        page.config.downsampleDpi = row.dpi;
+        page.config.downsampleThreshold = row.threshold;
+        FakeRaster raster(RASTERKIND_PNG, row.columns, row.rows);
+        EXPECT_TRUE(
+            page.manager().execDownsample(&raster, MoxLength(row.width, MoxCommonNS::MOXUNIT_INCH),
+                                          MoxLength(row.height, MoxCommonNS::MOXUNIT_INCH)));
+        EXPECT_EQ(raster.targetColumns, row.targetColumns);
+        EXPECT_EQ(raster.targetRows, row.targetRows);
+    }
+}
+
+TEST(SVGGraphicManagerEmbed, ResolutionIsDividedByTheScaledPlace) {
+    ImagePage page;
+    page.config.downsampleDpi = 10000;
+    page.config.downsampleThreshold = 0;
+    page.impl.setScale(0.3F);
+    FakeRaster raster(RASTERKIND_PNG, 543, 10000);
+    EXPECT_TRUE(page.manager().execDownsample(&raster, MoxLength(20.0F, MoxCommonNS::MOXUNIT_INCH),
+                                              MoxLength(20.0F, MoxCommonNS::MOXUNIT_INCH)));
+    EXPECT_EQ(raster.targetColumns, 543);
+    EXPECT_EQ(raster.targetRows, 543);
+    EXPECT_EQ(raster.xResolution, 91.0);
+    EXPECT_EQ(raster.yResolution, 91.0);
+}
+
 TEST(SVGGraphicManagerEmbed, LengthsOfNoUseStateNoResolution) {
     constexpr float infinite = std::numeric_limits<float>::infinity();
     constexpr float nan = std::numeric_limits<float>::quiet_NaN();
