@@ -33,6 +33,9 @@ constexpr const char16_t* saveOptions[] = {
     u"", u"indent", u"decimals=2", u"indent,decimals=0", u",,decimals=99999999999,=",
 };
 
+constexpr const char16_t* imageWords[] = {u"embed-all", u"link", u"copy-all", u"copy", u"none"};
+constexpr const char16_t* conversionWords[] = {u"auto", u"jpg", u"jpg-all", u"png", u"png-all"};
+
 constexpr MoxCommonNS::MoxNameEnum linkKeys[] = {
     MoxCommonNS::MOXNAME_INTERNAL, MoxCommonNS::MOXNAME_EXTERNAL, MoxCommonNS::MOXNAME_SHOW,
     MoxCommonNS::MOXNAME_PAGE,     MoxCommonNS::MOXNAME_ID,       MoxCommonNS::MOXNAME_NAME,
@@ -47,8 +50,13 @@ void RandomCalls::configure(SVGConfig& config) {
     config.wispMode = flag();
     config.colorFlag = flag();
     config.imageBaseUri = make<UnicodeString>();
-    config.setImageProcessingType(make<MoxName>());
-    config.setImageConversion(make<MoxName>());
+    config.setImageProcessingType(MoxName(pick(imageWords)));
+    config.setImageConversion(MoxName(pick(conversionWords)));
+    config.svgOutputUri = directory.uri("page.svg"); // copies go beside it
+    config.jpegQuality = make<int>();
+    config.downsampleDpi = make<int>();
+    config.downsampleThreshold = make<int>();
+    config.downsampleType = make<int>();
     config.setEmbedFonts(make<UnicodeString>());
     config.adjustConfig();
 }

@@ -1,6 +1,9 @@
 #include "tests/frontend/RandomCalls.h"
 
+#include "foundation/records/TLMemoryImage.h"
 #include "foundation/records/TLStringWithGlyphInfo.h"
+#include "tests/fonts/EmbeddedFont.h"
+#include "tests/support/TinyImages.h"
 
 namespace DrawmereTest {
 namespace {
@@ -21,6 +24,45 @@ template <typename... Args> struct With {
         return member;
     }
 };
+
+/// An image of a type that its bytes don't tell.
+class AnyImage : public TalGraphic::TLMemoryImage {
+public:
+    AnyImage(TLGraphicType imageType, std::string_view bytes, const UnicodeString& name)
+        : TLMemoryImage(bytes, name), type(imageType) {}
+
+    TLGraphicType getGraphicType() override { return type; }
+
+private:
+    TLGraphicType type;
+};
+
+/// Draws a small file, sometimes a damaged one and mostly by a name that was drawn before.
+void drawFile(RandomCalls& any, Drawmere& page) {
+    static const std::string files[] = {makePng(3, 2), makePng(40, 30, /*hasAlpha=*/true),
+                                        makeBmp(5, 4), "<svg/>", ""};
+    constexpr const char16_t* names[] = {u"", u"in/a.png", u"b.bmp", u"c"};
+    constexpr TLGraphicType types[] = {TalGraphic::TLGRAPHICTYPE_OTHER,
+                                       TalGraphic::TLGRAPHICTYPE_PNG};
+    const std::string& file = files[any.below(5)];
+    const bool isDamaged = any.below(8) == 0;
+    const std::string bytes = file.substr(0, isDamaged ? file.size() / 2 : file.size());
+    const bool isOdd = any.below(4) == 0;
+    const auto type = isOdd ? any.make<TLGraphicType>() : any.pick(types);
+    AnyImage image(type, bytes, isOdd ? any.make<UnicodeString>() : UnicodeString(any.pick(names)));
+    const auto length = [&any] { return any.make<MoxLength>(); };
+    page.drawImage(&image, type, length(), length(), length(), length());
+}
+
+/// Sets a font that there is.
+void setTestFont(RandomCalls& any, Drawmere& page) {
+    constexpr const char16_t* faces[] = {uprightFace, hanFace, arabicFace, latinFace};
+    SVGFont font = any.make<SVGFont>();
+    font.setFontAttribute(any.pick(faces), any.make<MoxLength>(), FONTWEIGHT_NORMAL, FSTYLE_NORMAL,
+                          any.make<UnicodeString>(), any.flag());
+    font.setEmbedAttribute(any.below(4) != 0, any.flag());
+    page.setFont(&font, &testFonts());
+}
 
 using Length = MoxLength;
 using Point = const MoxPointT<MoxLength>&;
@@ -120,6 +162,8 @@ constexpr void (*calls[])(RandomCalls& any, Drawmere& page) = {
         page.drawImage(nullptr, any.make<TLGraphicType>(), any.make<MoxLength>(),
                        any.make<MoxLength>(), any.make<MoxLength>(), any.make<MoxLength>());
     },
+    drawFile,
+    setTestFont,
 };
 
 } // namespace

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "Drawmere.h"
+#include "tests/support/TempDir.h"
 
 #include <cstddef>
 #include <iosfwd>
@@ -52,6 +53,7 @@ public:
 
 private:
     std::mt19937 numbers;
+    TempDir directory;
 };
 
 template <> bool RandomCalls::make<bool>();

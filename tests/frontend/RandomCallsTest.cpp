@@ -4,8 +4,10 @@
 
 #include <gtest/gtest.h>
 
+#include <set>
 #include <sstream>
 #include <string>
+#include <vector>
 
 namespace DrawmereTest {
 namespace {
@@ -30,6 +32,26 @@ TEST(RandomCalls, EveryDocumentIsWellFormed) {
         EXPECT_EQ(reading.error, "") << "seed " << seed;
         EXPECT_GT(reading.events.size(), 2U) << "seed " << seed;
     }
+}
+
+TEST(RandomCalls, EveryUseLeadsToAnImage) {
+    int useCount = 0;
+    for (unsigned seed = 0; seed < seedCount; ++seed) {
+        std::set<std::string> images;
+        std::vector<std::string> uses;
+        for (const XmlEvent& event : readXml(drawAnything(seed)).events) {
+            if (event.kind == XmlEvent::START && event.name == "image") {
+                images.insert("#" + event.attribute("id"));
+            } else if (event.kind == XmlEvent::START && event.name == "use") {
+                uses.push_back(event.attribute("xlink:href"));
+            }
+        }
+        for (const std::string& use : uses) {
+            EXPECT_TRUE(images.contains(use)) << use << ", seed " << seed;
+        }
+        useCount += static_cast<int>(uses.size());
+    }
+    EXPECT_GT(useCount, 10);
 }
 
 TEST(RandomCalls, TheSameCallsWriteTheSameBytes) {
