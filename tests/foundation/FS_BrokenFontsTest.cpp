@@ -1,7 +1,7 @@
 #include "foundation/fontservice/FS_FontInfo.h"
 
 #include "tests/foundation/TestFonts.h"
-#include "tests/foundation/TinyFont.h"
+#include "tests/support/TinyFont.h"
 
 #include <gtest/gtest.h>
 

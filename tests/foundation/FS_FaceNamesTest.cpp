@@ -1,7 +1,7 @@
 #include "foundation/fontservice/FS_FaceNames.h"
 
 #include "foundation/fontservice/FS_Face.h"
-#include "tests/foundation/TinyFont.h"
+#include "tests/support/TinyFont.h"
 #include "tests/support/Utf8.h"
 
 #include <gtest/gtest.h>

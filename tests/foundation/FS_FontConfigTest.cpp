@@ -2,8 +2,8 @@
 
 #include "foundation/fontservice/FS_SystemFonts.h"
 #include "tests/foundation/TestFonts.h"
-#include "tests/foundation/TinyFont.h"
 #include "tests/support/TempDir.h"
+#include "tests/support/TinyFont.h"
 #include "tests/support/Utf8.h"
 
 #include <gtest/gtest.h>

@@ -2,7 +2,7 @@
 
 #include "foundation/fontservice/FS_FaceCache.h"
 #include "tests/foundation/TestFonts.h"
-#include "tests/foundation/TinyFont.h"
+#include "tests/support/TinyFont.h"
 #include "tests/support/Utf8.h"
 
 #include <gtest/gtest.h>

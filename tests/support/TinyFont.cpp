@@ -1,4 +1,4 @@
-#include "tests/foundation/TinyFont.h"
+#include "tests/support/TinyFont.h"
 
 #include <algorithm>
 #include <utility>
