@@ -273,5 +273,15 @@ TEST(DrawmereImplClips, LeaveNoGroupThatNothingIsDrawnIn) {
                            "fill=\"none\"/>\n</g>");
 }
 
+TEST(DrawmereImplClips, LeaveNoEmptyGroupWhenTheTreeWasLockedEither) {
+    SvgPage page;
+    drawBox(page, 0);
+    page.drawmere.impl->treeManager->setupStopLock();
+    page->doClip();
+    page.drawmere.impl->treeManager->defuseStopLock();
+    drawBox(page, 0);
+    EXPECT_EQ(page.body().find("<g/>"), std::string::npos);
+}
+
 } // namespace
 } // namespace DrawmereTest
