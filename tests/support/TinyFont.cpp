@@ -139,19 +139,33 @@ std::string TinyFont::buildOutlineLimits() const {
 
 // Characters of the basic plane, one segment each.
 std::string TinyFont::buildCharMap() const {
+    constexpr int lastShort = 0xFFFF;
+    if (!characters.empty() && characters.rbegin()->first > lastShort) {
+        return buildLongCharMap();
+    }
     std::vector<int> ends;
     std::vector<int> deltas;
     for (const auto& [character, glyph] : characters) {
         ends.push_back(character);
         deltas.push_back(glyph - character);
     }
-    ends.push_back(0xFFFF);
+    ends.push_back(lastShort);
     deltas.push_back(1);
     const int count = static_cast<int>(ends.size());
     std::string segments = words({4, 16 + 8 * count, 0, 2 * count, 0, 0, 0}) + words(ends) +
                            word(0) + words(ends) + words(deltas) +
                            std::string(2 * static_cast<std::size_t>(count), '\0');
     return words({0, 1, 3, symbolic ? 0 : 1}) + dword(12) + segments;
+}
+
+std::string TinyFont::buildLongCharMap() const {
+    std::string groups;
+    for (const auto& [character, glyph] : characters) {
+        groups += dword(character) + dword(character) + dword(glyph);
+    }
+    const auto count = static_cast<std::int64_t>(characters.size());
+    return words({0, 1, 3, 10}) + dword(12) + words({12, 0}) + dword(16 + 12 * count) + dword(0) +
+           dword(count) + groups;
 }
 
 std::string TinyFont::buildNames() const {

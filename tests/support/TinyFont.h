@@ -72,6 +72,7 @@ private:
     std::string buildLineHeader(int metricCount) const;
     std::string buildOutlineLimits() const;
     std::string buildCharMap() const;
+    std::string buildLongCharMap() const;
     std::string buildNames() const;
     std::string buildStyle() const;
     std::string buildAxes() const;
