@@ -41,6 +41,8 @@ SVGEmbFont* SVGFontManager::findFont(const SVGFont& font, FS_ExtraFonts* extraFo
     return entry;
 }
 
+/// On purpose: fonts without a face can't be told apart, so they are one, that of the first
+/// request. Kept apart, each would put a `font` without glyphs into the document.
 SVGEmbFont* SVGFontManager::findSameFace(SVGEmbFont& wanted) const {
     for (const auto& [key, font] : embFonts) {
         if (font->isSameFont(wanted)) {

@@ -138,6 +138,24 @@ TEST(SVGFontManager, WithoutACurrentFontOrItsFlagNothingIsCollected) {
     EXPECT_TRUE(font->horizontalGlyphs.empty());
 }
 
+TEST(SVGFontManager, AFontThatIsSelectedAgainIsEmbeddedAgain) {
+    Registry fonts;
+    SVGEmbFont* const font = fonts.select(makeFont(uprightFace, false));
+    font->fontAttribute.embedFont = false;
+    fonts.select(makeFont(uprightFace, false));
+    fonts.embedTextOrGlyph(u"X", nullptr, false, false);
+    EXPECT_EQ(describe(font->horizontalGlyphs), "X=2");
+}
+
+// On purpose: fonts without a face can't be told apart, so they are one, that of the first request.
+TEST(SVGFontManager, FontsWithoutAFaceAreOneFont) {
+    Registry fonts;
+    SVGEmbFont* const first = fonts.select(makeFont(u"No Such Face", false));
+    EXPECT_EQ(fonts.select(makeFont(u"No Such Face Either", false, 700, FSTYLE_ITALIC)), first);
+    EXPECT_EQ(utf8(first->faceFamily), "'No Such Face'");
+    EXPECT_EQ(fonts.embFonts.size(), 1U);
+}
+
 // Whole documents.
 
 TEST(EmbeddedFonts, AreWrittenWithTheGlyphsOfTheirTexts) {
