@@ -59,9 +59,7 @@ bool SVGEmbFont::loadFont(FS_ExtraFonts* extraFonts) {
                                              fontAttribute.fontStyle != FSTYLE_NORMAL,
                                              getWidthClass(fontAttribute.fontStretch), extraFonts,
                                              /*reserved=*/true);
-    if (created) {
-        forgetCharacters(); // what no face had the new one may have
-    } else {
+    if (!created) {
         errorMessage.append(makeErrorMessage(fontAttribute));
     }
     return true;
@@ -88,6 +86,9 @@ void SVGEmbFont::forgetCharacters() {
 }
 
 void SVGEmbFont::embedText(const UnicodeString& text, bool vertical) {
+    if (!fontInfo.isCreatedFont()) {
+        return; // and nothing is remembered that a face which comes late may have
+    }
     if (notedTexts != countTexts()) {
         forgetCharacters();
     }

@@ -87,7 +87,7 @@ public:
     FS_FontInfo fontInfo;
     FONTATTRIBUTE fontAttribute;
     UnicodeString faceFamily;
-    SVGGlyphMap horizontalGlyphs;
+    SVGGlyphMap horizontalGlyphs; // others may read both maps and add to them
     SVGGlyphMap verticalGlyphs;
     DrawmereErrHandler* errorHandler; // borrowed; for callers, nothing is reported to it
     UnicodeString errorMessage;

@@ -36,16 +36,25 @@ std::uint64_t hash(std::u16string_view text) {
 
 void SVGGlyphIndex::add(const SVGGlyphMap& map, const SVGGlyphMap::value_type& entry) {
     const bool isAsked = count != 0 || !slots.empty();
-    if (isAsked && count + 1 == map.size()) {
+    if (!isAsked) {
+        return;
+    }
+    if (count + 1 == map.size()) {
         note(&entry);
+    } else {
+        forget(); // as the count may be right again now, and entries gone
     }
 }
 
-void SVGGlyphIndex::fill(const SVGGlyphMap& map) {
+void SVGGlyphIndex::forget() {
     units.clear();
     slots.clear();
     taken = 0;
     count = 0;
+}
+
+void SVGGlyphIndex::fill(const SVGGlyphMap& map) {
+    forget();
     for (const SVGGlyphMap::value_type& entry : map) {
         note(&entry);
     }

@@ -9,7 +9,8 @@ namespace DrawmereNS {
 /// Finds the entries of one map by their only unit or by a hash, as nearly every text that is drawn
 /// is known already and a search in the map compares it with a dozen others. The map alone says
 /// what there is: an index that doesn't count as many entries is made anew, and one that texts of
-/// one hash crowd leaves some of them to the map.
+/// one hash crowd leaves some of them to the map. So whoever takes entries out of the map must not
+/// put as many others in before the index follows it again.
 class SVGGlyphIndex {
 public:
     /// Makes the index anew if `map`, the same in each call, was changed behind its back.
@@ -32,6 +33,7 @@ public:
 private:
     using Entry = const SVGGlyphMap::value_type*; // borrowed from the map
 
+    void forget();
     void fill(const SVGGlyphMap& map);
     void note(Entry entry);
     void makeRoom();

@@ -80,6 +80,22 @@ TEST(SVGGlyphIndex, AMapThatWasChangedFromOutsideIsReadAnew) {
     EXPECT_FALSE(texts.knows(u"b"));
 }
 
+TEST(SVGGlyphIndex, WhatWasTakenOutIsForgottenWhenTheNextComes) {
+    IndexedMap texts;
+    for (const std::u16string_view text : {u"ab", u"cd", u"e"}) {
+        texts.add(text);
+        ASSERT_TRUE(texts.knows(text));
+    }
+    texts.map.erase(SVGEmbTLString(u"ab"));
+    texts.map.erase(SVGEmbTLString(u"e"));
+    texts.add(u"fg");
+    texts.add(u"hi"); // and the count is what it was
+    EXPECT_FALSE(texts.knows(u"ab"));
+    EXPECT_FALSE(texts.knows(u"e"));
+    EXPECT_TRUE(texts.knows(u"cd"));
+    EXPECT_TRUE(texts.knows(u"hi"));
+}
+
 /// Returns: texts that the index would look for in one place, as somebody who knows it may make.
 std::vector<std::u16string> makeCrowd(std::size_t count) {
     constexpr std::uint64_t spread = 0x9E3779B97F4A7C15;
