@@ -1,0 +1,110 @@
+#include "tests/convert/Conversion.h"
+#include "tests/convert/DrawnPage.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+namespace DrawmereTest {
+namespace {
+
+using testing::HasSubstr;
+using testing::Not;
+
+constexpr const char* form = "/Type/XObject/Subtype/Form/BBox[0 0 200 100]"
+                             "/Group<</S/Transparency/CS/DeviceGray>>";
+
+/// A page that draws the group `content` at half opacity.
+PageSource makeGroup(const std::string& content) {
+    return {"/G gs /F Do", "/ExtGState<</G<</ca 0.5>>>>/XObject<</F 5 0 R>>", {{form, content}}};
+}
+
+/// A page that draws `content` through the mask `mask`.
+PageSource makeMasked(const std::string& mask, const std::string& content,
+                      const std::string& kind = "Luminosity") {
+    return {"/G gs " + content,
+            "/ExtGState<</G<</SMask<</S/" + kind + "/G 5 0 R>>>>>>",
+            {{form, mask}}};
+}
+
+TEST(Layers, AGroupOfOneObjectGivesItItsOpacity) {
+    const DrawnPage page(makeGroup("10 10 m 60 10 l 35 40 l f"));
+    EXPECT_EQ(page.count("pattern"), 0);
+    EXPECT_THAT(page.body(), HasSubstr(" opacity=\"0.5\""));
+}
+
+TEST(Layers, ObjectsThatDontOverlapHaveTheOpacityOneByOne) {
+    const DrawnPage page(makeGroup("10 10 20 20 re f 50 10 20 20 re f"));
+    EXPECT_EQ(page.count("pattern"), 0);
+    EXPECT_EQ(page.count("rect"), 2);
+}
+
+TEST(Layers, ObjectsThatOverlapBecomeAPatternThatHasTheOpacity) {
+    const DrawnPage page(makeGroup("1 0 0 rg 10 10 20 20 re f 0 0 1 rg 20 10 20 20 re f"));
+    EXPECT_EQ(page.count("pattern"), 1);
+    EXPECT_EQ(page.count("rect"), 3);
+    EXPECT_THAT(page.svg.substr(page.svg.find("</defs>")), HasSubstr(" opacity=\"0.5\""));
+    EXPECT_THAT(page.svg.substr(0, page.svg.find("</defs>")), Not(HasSubstr("opacity")));
+}
+
+TEST(Layers, ALuminosityMaskIsGrey) {
+    const DrawnPage page(makeMasked("1 0 0 rg 0 0 200 100 re f", "10 10 50 50 re f"));
+    EXPECT_EQ(page.count("mask"), 1);
+    EXPECT_EQ(page.attribute("rect", "fill"), "#4d4d4d"); // the brightness of red
+    EXPECT_THAT(page.svg.substr(page.svg.find("</defs>")), HasSubstr("mask=\"url(#i0)\""));
+}
+
+TEST(Layers, AnAlphaMaskIsWhite) {
+    const DrawnPage page(makeMasked("1 0 0 rg 0 0 99 99 re f", "10 10 50 50 re f", "Alpha"));
+    EXPECT_EQ(page.attribute("rect", "fill"), "#fff");
+}
+
+TEST(Layers, AMaskedGroupIsMaskedTogether) {
+    PageSource source = makeMasked("0.5 g 0 0 200 100 re f", "/X Do");
+    source.resources += "/XObject<</X 6 0 R>>";
+    source.objects.emplace_back(form, "10 10 50 50 re f 1 0 0 rg 30 30 50 50 re f");
+    const DrawnPage page(source);
+    EXPECT_EQ(page.count("mask"), 1);
+    EXPECT_EQ(page.count("pattern"), 1);
+    EXPECT_THAT(page.svg.substr(page.svg.find("</defs>")), HasSubstr("fill=\"url(#t0)\""));
+}
+
+TEST(Layers, ATilingPatternIsAPattern) {
+    const DrawnPage page(
+        {"/Pattern cs /P scn 10 10 m 90 10 l 50 80 l f",
+         "/Pattern<</P 5 0 R>>",
+         {{"/PatternType 1/PaintType 1/TilingType 1/BBox[0 0 10 10]/XStep 10/YStep 10/Resources<<>>",
+           "1 0 0 rg 0 0 5 5 re f"}}});
+    EXPECT_EQ(page.count("pattern"), 1);
+    EXPECT_EQ(page.attribute("pattern", "width"), "10");
+    EXPECT_EQ(page.attribute("path", "fill"), "url(#t0)");
+    EXPECT_EQ(page.count("clipPath"), 0);
+    EXPECT_EQ(page.report.countApproximations(), 0);
+}
+
+TEST(Layers, APatternWhoseCellsOverlapIsCounted) {
+    const DrawnPage page(
+        {"/Pattern cs /P scn 10 10 80 80 re f",
+         "/Pattern<</P 5 0 R>>",
+         {{"/PatternType 1/PaintType 1/TilingType 1/BBox[0 0 20 20]/XStep 10/YStep 10/Resources<<>>",
+           "1 0 0 rg 0 0 15 15 re f"}}});
+    EXPECT_EQ(page.report.approximations.at(DrawmereConvert::APPROXIMATION_PATTERN), 1);
+}
+
+TEST(Layers, BlendModesAreCounted) {
+    const DrawnPage page({"/G gs 10 10 50 50 re f", "/ExtGState<</G<</BM/Multiply>>>>"});
+    EXPECT_EQ(page.report.approximations.at(DrawmereConvert::APPROXIMATION_BLEND), 1);
+    EXPECT_EQ(page.count("rect"), 1);
+}
+
+TEST(Layers, TextClipsWhatComesAfterIt) {
+    const DrawnPage page(Conversion::document("TextClippingModeChanges.pdf"), 0);
+    EXPECT_GT(page.count("clipPath"), 0);
+}
+
+TEST(Layers, AMaskWithABackdropCoversWhatItsContentLeavesOut) {
+    const DrawnPage page(Conversion::document("issue7891_bc1.pdf"), 0);
+    EXPECT_EQ(page.count("mask"), 1);
+}
+
+} // namespace
+} // namespace DrawmereTest

@@ -1,0 +1,68 @@
+#include "tests/convert/Conversion.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+namespace DrawmereTest {
+namespace {
+
+using testing::HasSubstr;
+using testing::Not;
+
+/// A document with a table of contents, whose entries lead into later pages.
+struct LinkedPages : testing::Test {
+    void convert(std::vector<std::string> words) const {
+        words.insert(words.begin(), Conversion::document("pdflatex-outline.pdf"));
+        EXPECT_EQ(conversion.run(words).status, 0);
+    }
+
+    Conversion conversion;
+};
+
+using LinkWriter = LinkedPages;
+
+TEST_F(LinkWriter, ALinkToAnotherPageHasItsFileAndThePlaceThere) {
+    convert({"-o", "out/p.svg"});
+    EXPECT_THAT(conversion.directory.read("out/p1.svg"),
+                HasSubstr("<a xlink:href=\"p2.svg#dest-2-125-126\">"));
+    EXPECT_THAT(conversion.directory.read("out/p2.svg"),
+                HasSubstr("<text id=\"dest-2-125-126\"/>"));
+}
+
+TEST_F(LinkWriter, ThePlaceOfADestinationIsThatOfItsGroup) {
+    convert({"-o", "out/p.svg"});
+    EXPECT_THAT(conversion.directory.read("out/p2.svg"),
+                HasSubstr("<g transform=\"translate(124.802,125.798035)\">"
+                          "<g transform=\"translate(0)\"><text id=\"dest-2-125-126\"/>"));
+}
+
+TEST_F(LinkWriter, ALinkIsATransparentRectangle) {
+    convert({"-o", "out/p.svg"});
+    EXPECT_THAT(conversion.directory.read("out/p1.svg"),
+                HasSubstr("<a xlink:href=\"p2.svg#dest-2-125-126\"><g fill-opacity=\"0\"><rect"));
+}
+
+TEST_F(LinkWriter, InASingleFileLinksStayInside) {
+    convert({"-o", "all.svg", "--single-file"});
+    const std::string all = conversion.directory.read("all.svg");
+    EXPECT_THAT(all, HasSubstr("<a xlink:href=\"#dest-2-125-126\">"));
+    EXPECT_THAT(all, HasSubstr("<text id=\"dest-2-125-126\"/>"));
+}
+
+TEST_F(LinkWriter, ALinkToAPageThatIsNotConvertedIsNone) {
+    convert({"-o", "out/p.svg", "--pages", "1,3"});
+    const std::string page = conversion.directory.read("out/p1.svg");
+    EXPECT_THAT(page, HasSubstr("p3.svg#"));
+    EXPECT_THAT(page, Not(HasSubstr("p2.svg#")));
+}
+
+TEST_F(LinkWriter, ALinkOutOfTheDocumentIsTakenOver) {
+    EXPECT_EQ(
+        conversion.run({Conversion::document("LinkAnnot-appearances.pdf"), "-o", "p.svg"}).status,
+        0);
+    EXPECT_THAT(conversion.directory.read("p.svg"),
+                HasSubstr("<a xlink:href=\"https://pdfa.org\">"));
+}
+
+} // namespace
+} // namespace DrawmereTest

@@ -1,0 +1,114 @@
+#include "tests/convert/Conversion.h"
+#include "tests/convert/DrawnPage.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+namespace DrawmereTest {
+namespace {
+
+using DrawmereConvert::ConvertOptions;
+using DrawmereConvert::TEXTMODE;
+using DrawmereConvert::TEXTMODE_FONTS;
+using DrawmereConvert::TEXTMODE_OUTLINES;
+using DrawmereConvert::TEXTMODE_PLAIN;
+using testing::HasSubstr;
+using testing::Not;
+
+const std::string helvetica =
+    "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica/Encoding/WinAnsiEncoding>>>>";
+
+DrawnPage drawText(const std::string& operators, TEXTMODE mode) {
+    ConvertOptions options;
+    options.textMode = mode;
+    return DrawnPage({"BT /F 20 Tf 10 40 Td " + operators + " ET", helvetica}, options);
+}
+
+TEST(OutlineText, ARunOfGlyphsIsOnePath) {
+    const DrawnPage page = drawText("(Hello) Tj", TEXTMODE_OUTLINES);
+    EXPECT_EQ(page.count("path"), 1);
+    EXPECT_TRUE(page.texts().empty());
+}
+
+TEST(OutlineText, RunsOfOneColourAreOnePath) {
+    const DrawnPage page =
+        drawText("(Hello) Tj ET BT /F 10 Tf 10 20 Td (there) Tj", TEXTMODE_OUTLINES);
+    EXPECT_EQ(page.count("path"), 1);
+    const DrawnPage colored = drawText("(Hello) Tj 1 0 0 rg (there) Tj", TEXTMODE_OUTLINES);
+    EXPECT_EQ(colored.count("path"), 2);
+}
+
+TEST(TextWriter, TextThatFollowsItsFontHasOnePosition) {
+    const DrawnPage page = drawText("(Hello) Tj", TEXTMODE_FONTS);
+    EXPECT_EQ(page.texts(), std::vector<std::string>{"Hello"});
+    EXPECT_THAT(page.svg, HasSubstr("<text x=\"10\" y=\"60\""));
+    EXPECT_EQ(page.count("font"), 1);
+    EXPECT_EQ(page.count("glyph"), 4); // H e l o
+}
+
+TEST(TextWriter, TextThatDoesNotHasAPositionForEachCharacter) {
+    const DrawnPage page = drawText("[(A) 100 (V) 100 (A)] TJ", TEXTMODE_FONTS);
+    EXPECT_EQ(page.texts(), std::vector<std::string>{"AVA"});
+    EXPECT_THAT(page.svg, HasSubstr("<text x=\"10 21.34 32.68\""));
+}
+
+TEST(TextWriter, WhatFollowsTheLastShiftNeedsNoPosition) {
+    const DrawnPage page = drawText("[(A) 100 (VAV)] TJ", TEXTMODE_FONTS);
+    EXPECT_THAT(page.svg, HasSubstr("<text x=\"10 21.34\""));
+}
+
+TEST(TextWriter, EachLineIsATextOfItsOwn) {
+    const DrawnPage page = drawText("(one) Tj 0 -20 Td (two) Tj", TEXTMODE_FONTS);
+    EXPECT_EQ(page.texts(), (std::vector<std::string>{"one", "two"}));
+}
+
+TEST(TextWriter, TurnedTextHasAMatrix) {
+    const DrawnPage page = drawText("0 1 -1 0 50 10 Tm (up) Tj", TEXTMODE_FONTS);
+    EXPECT_EQ(page.texts(), std::vector<std::string>{"up"});
+    EXPECT_THAT(page.body(), HasSubstr("transform=\"rotate(-90)\""));
+}
+
+TEST(TextWriter, EmbeddedOutlinesFillByTheirOwnRule) {
+    EXPECT_EQ(drawText("(o) Tj", TEXTMODE_FONTS).svg.find("fill-rule=\"nonzero\""),
+              drawText("(o) Tj", TEXTMODE_FONTS).svg.rfind("fill-rule=\"nonzero\""));
+    EXPECT_THAT(drawText("(o) Tj", TEXTMODE_FONTS).svg, HasSubstr("fill-rule=\"nonzero\""));
+}
+
+TEST(TextWriter, PlainTextNamesFamiliesAndPlacesEachCharacter) {
+    const DrawnPage page = drawText("(Hello) Tj", TEXTMODE_PLAIN);
+    EXPECT_EQ(page.texts(), std::vector<std::string>{"Hello"});
+    EXPECT_EQ(page.count("font"), 0);
+    EXPECT_THAT(page.svg, HasSubstr("font-family=\"Helvetica,"));
+    EXPECT_THAT(page.svg, HasSubstr("sans-serif"));
+    EXPECT_THAT(page.svg, HasSubstr("<text x=\"10 24.44 35.56 40 44.44\""));
+}
+
+TEST(TextWriter, TextThatDoesNotShowIsStillText) {
+    const DrawnPage page = drawText("3 Tr (hidden) Tj", TEXTMODE_FONTS);
+    EXPECT_EQ(page.texts(), std::vector<std::string>{"hidden"});
+    EXPECT_THAT(page.body(), HasSubstr("fill=\"none\""));
+    EXPECT_EQ(page.count("font"), 0);
+    EXPECT_EQ(drawText("3 Tr (hidden) Tj", TEXTMODE_OUTLINES).count("path"), 0);
+}
+
+TEST(TextWriter, TextFromRightToLeftIsInTheOrderOfSpeech) {
+    ConvertOptions options;
+    options.textMode = TEXTMODE_FONTS;
+    const DrawnPage page(Conversion::document("habibi-rotated.pdf"), 0, options);
+    EXPECT_THAT(page.svg, HasSubstr("\u062D\u064E\u0628\u064A\u0628\u064A"));
+    EXPECT_THAT(page.svg, Not(HasSubstr("direction=\"rtl\"")));
+}
+
+TEST(Type3Outline, BitmapGlyphsBecomePathsInEveryMode) {
+    for (const TEXTMODE mode : {TEXTMODE_OUTLINES, TEXTMODE_FONTS, TEXTMODE_PLAIN}) {
+        ConvertOptions options;
+        options.textMode = mode;
+        const DrawnPage page(Conversion::document("french_diacritics.pdf"), 0, options);
+        EXPECT_EQ(page.count("image"), 0);
+        EXPECT_GT(page.count("path"), 0);
+        EXPECT_EQ(page.report.countApproximations(), 0);
+    }
+}
+
+} // namespace
+} // namespace DrawmereTest
