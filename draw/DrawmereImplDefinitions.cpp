@@ -105,8 +105,6 @@ void DrawmereImpl::doClip() {
     SVGElement* openGroup = groupManager->getGroupRootNode();
     if (openGroup) {
         openGroup->appendChild(group.get());
-        // A locked tree takes no note of the group, which is empty and has to go in the end.
-        wantsWalk = wantsWalk || !treeManager->unlocked;
     }
     treeManager->appendNewGroup(group.get(), /*makeCurrent=*/!openGroup);
 }
