@@ -2,7 +2,7 @@
 #include "draw/SVGTinyImpl.h"
 #include "state/SVGGraphicContext.h"
 #include "state/SVGGroupManager.h"
-#include "tests/draw/DrawnTree.h"
+#include "tests/draw/FilteringImpl.h"
 #include "tests/draw/QueuedErrors.h"
 #include "tests/support/Golden.h"
 #include "tree/SVGTreeManager.h"
@@ -110,6 +110,23 @@ TEST(DrawmereImplClips, AnEndWithoutAStartIsAnError) {
     EXPECT_EQ(catchError([&] { tree.impl.endClipDef(); }), otherTypeError);
     tree.impl.pushState(ELEMENT_TYPE_MASK);
     EXPECT_EQ(catchError([&] { tree.impl.endClipDef(); }), otherTypeError);
+}
+
+TEST(DrawmereImplClips, AnEndThatFailsLeavesTheDefinitionOpen) {
+    DrawnTree tree;
+    tree.impl.startClipDef(USERSPACEONUSE);
+    tree.impl.pushState(ELEMENT_TYPE_PLAIN);
+    EXPECT_EQ(catchError([&] { tree.impl.endClipDef(); }), otherTypeError);
+    EXPECT_TRUE(tree.impl.inClipDef);
+}
+
+TEST(DrawmereImplClips, GoThroughTheFilterOfTheProfile) {
+    DrawnTree<FilteringImpl> tree;
+    tree.impl.startClipDef(USERSPACEONUSE);
+    tree.impl.endClipDef();
+    tree.impl.startClipRect(USERSPACEONUSE);
+    tree.impl.endClipDef();
+    EXPECT_EQ(tree.impl.told, "clipPath direct current\nclipPath direct current\n");
 }
 
 TEST(DrawmereImplClips, WarnUnderTinyOnceAndRunAllTheSame) {

@@ -1,7 +1,8 @@
 // Gradients and their stops.
 #include "draw/DrawmereImpl.h"
 #include "state/SVGGraphicContext.h"
-#include "tests/draw/DrawnTree.h"
+#include "state/SVGGroupManager.h"
+#include "tests/draw/FilteringImpl.h"
 #include "tests/draw/QueuedErrors.h"
 #include "tests/support/Golden.h"
 #include "tree/SVGTreeManager.h"
@@ -214,6 +215,25 @@ TEST(DrawmereImplGradients, LetNoTextInThatAStopFollows) {
     tree.impl.setStopColor(MoxColor(), 0, 1);
     tree.impl.endGradiant();
     EXPECT_EQ(tree.content().find("word"), std::string::npos);
+}
+
+TEST(DrawmereImplGradients, AStopClosesTheGroupOfAText) {
+    DrawnTree tree;
+    startLinear(tree.impl);
+    drawWord(tree.impl);
+    ASSERT_NE(tree.impl.groupManager->getGroupRootNode(), nullptr);
+    tree.impl.setStopColor(MoxColor(), 0, 1);
+    EXPECT_EQ(tree.impl.groupManager->getGroupRootNode(), nullptr);
+}
+
+TEST(DrawmereImplGradients, GoThroughTheFilterOfTheProfileWithTheirStops) {
+    DrawnTree<FilteringImpl> tree;
+    startLinear(tree.impl);
+    tree.impl.setStopColor(MoxColor(), 0, 1);
+    tree.impl.endGradiant();
+    startRadial(tree.impl);
+    EXPECT_EQ(tree.impl.told, "linearGradient direct current\nstop direct\n"
+                              "radialGradient direct current\n");
 }
 
 TEST(DrawmereImplGradients, LetEverythingInToTheTreeBehindTheirEnd) {

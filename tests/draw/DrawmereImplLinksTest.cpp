@@ -1,6 +1,6 @@
 // Links and their destinations.
 #include "draw/DrawmereImpl.h"
-#include "tests/draw/DrawnTree.h"
+#include "tests/draw/FilteringImpl.h"
 
 #include <gtest/gtest.h>
 #include <limits>
@@ -11,19 +11,6 @@ namespace {
 void drawDot(DrawmereImpl& impl) { impl.drawCircle(pt(1), pt(2), pt(3), PAINTMODE_NONE); }
 
 constexpr char dot[] = "<circle cx=\"1\" cy=\"2\" r=\"3\" fill=\"none\"/>";
-
-/// Tells what comes to where the profiles filter.
-struct FilteringImpl : SVGFullImpl {
-    using SVGFullImpl::SVGFullImpl;
-
-    void addElement(SVGElement* element, bool direct, bool makeCurrent) override {
-        told += utf8(MoxValue(element->getLocalName()).toString()) + (direct ? " direct" : "") +
-                (makeCurrent ? " current" : "") + "\n";
-        SVGFullImpl::addElement(element, direct, makeCurrent);
-    }
-
-    std::string told;
-};
 
 /// Returns: the content of a document with one link.
 std::string drawLink(const UnicodeString& href, const MoxName& show) {

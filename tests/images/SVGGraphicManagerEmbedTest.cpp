@@ -121,6 +121,22 @@ TEST(SVGGraphicManagerEmbed, ImageInALinkHasTheMatrixOfTheGroupAndNoClipPath) {
     EXPECT_EQ(drawInLink(/*isApart=*/false), "<a xlink:href=\"u\">\n<g>\n" + image + "</g>\n</a>");
 }
 
+TEST(SVGGraphicManagerEmbed, OpacityThatTheGroupHasIsNotWrittenAgain) {
+    // The first image takes the state over into the group, in a link as under the root.
+    for (const bool isInLink : {false, true}) {
+        EmbedPage page;
+        if (isInLink) {
+            page.impl.startLink(u"u", MoxName());
+        }
+        page.impl.getGContext()->setOpacity(0.5F, OPACITYDEST_FILL);
+        page.manager().imageParent = page.impl.treeManager->getCurrentNode();
+        page.manager().useEmbededImage(u"#a", pt(1), pt(1), pt(1), pt(1));
+        page.manager().useEmbededImage(u"#b", pt(1), pt(1), pt(1), pt(1));
+        EXPECT_THAT(page.content(), HasSubstr("xlink:href=\"#a\" opacity=\"0.5\"/>"));
+        EXPECT_THAT(page.content(), HasSubstr("xlink:href=\"#b\"/>"));
+    }
+}
+
 TEST(SVGGraphicManagerEmbed, CursorStaysInDefsUntilTheNextPop) {
     EmbedPage page;
     const std::string bytes = makePng(2, 2);
@@ -197,6 +213,18 @@ TEST(SVGGraphicManagerEmbed, PngUnderJpgAllBecomesJpeg) {
     TLMemoryImage image(bytes);
     page.drawApart(image);
     EXPECT_THAT(page.uri(0), StartsWith("data:image/jpeg;base64,\n/9j/"));
+}
+
+TEST(SVGGraphicManagerEmbed, QualityIsTheOneOfTheConfiguration) {
+    EmbedPage page; // its manager noted another quality when the document began
+    page.config.setImageConversion(MoxName(u"jpg-all"));
+    const std::string bytes = makePng(64, 64);
+    TLMemoryImage image(bytes);
+    page.config.jpegQuality = 5;
+    page.drawApart(image);
+    page.config.jpegQuality = 95;
+    page.drawApart(image);
+    EXPECT_GT(page.uri(1).size(), page.uri(0).size());
 }
 
 TEST(SVGGraphicManagerEmbed, DownsampledImageIsWrittenAnew) {

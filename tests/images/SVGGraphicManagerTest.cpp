@@ -201,7 +201,7 @@ TEST(SVGGraphicManager, ReferredImageHasTheOpacityOfTheFillAsItsOwn) {
     page.impl.getGContext()->setOpacity(0.5F, OPACITYDEST_FILL);
     page.manager().referGraphic(u"b", pt(30), pt(20), pt(1), pt(2));
     page.impl.finishRootSvg();
-    EXPECT_THAT(page.content(), testing::HasSubstr("opacity=\"0.5\" xlink:href=\"b\""));
+    EXPECT_THAT(page.content(), testing::HasSubstr(" opacity=\"0.5\" xlink:href=\"b\""));
     EXPECT_THAT(page.errors(), IsEmpty());
 }
 
