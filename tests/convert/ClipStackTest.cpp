@@ -6,8 +6,10 @@
 namespace DrawmereTest {
 namespace {
 
+using DrawmereConvert::APPROXIMATION_CLIP;
 using DrawmereConvert::APPROXIMATION_DEPTH;
 using DrawmereConvert::ConvertOptions;
+using DrawmereNS::SVGConfig;
 
 TEST(ClipStack, AClipThatCutsNothingIsNotWritten) {
     const DrawnPage page({"10 10 100 50 re W n 20 20 30 30 re f", ""});
@@ -72,6 +74,28 @@ TEST(ClipStack, ElementsDontNestDeeperThanAllowed) {
     EXPECT_LE(page.depth(), 20);
     EXPECT_GT(page.depth(), 10);
     EXPECT_EQ(page.report.approximations.at(APPROXIMATION_DEPTH), 1);
+}
+
+const PageSource triangleClip = {"10 10 m 60 10 l 35 40 l W n 0 0 100 50 re f", ""};
+
+TEST(ClipStack, BasicClipsByTheRectangleAroundAPath) {
+    const DrawnPage page(triangleClip, {}, SVGConfig::SVGTYPE_BASIC);
+    EXPECT_EQ(page.count("clipPath"), 1);
+    EXPECT_EQ(page.attribute("rect", "x"), "10");
+    EXPECT_EQ(page.attribute("rect", "width"), "50");
+    EXPECT_EQ(page.report.approximations.at(APPROXIMATION_CLIP), 1);
+}
+
+TEST(ClipStack, TinyCutsRectanglesAndNothingElse) {
+    const DrawnPage page({"10 10 50 50 re W n 0 0 100 30 re f", ""}, {}, SVGConfig::SVGTYPE_TINY);
+    EXPECT_EQ(page.attribute("rect", "x"), "10");
+    EXPECT_EQ(page.attribute("rect", "width"), "50");
+    EXPECT_EQ(page.report.countApproximations(), 0);
+    const DrawnPage other({"10 10 50 50 re W n 0 0 m 99 0 l 50 99 l f", ""}, {},
+                          SVGConfig::SVGTYPE_TINY);
+    EXPECT_EQ(other.count("clipPath"), 0);
+    EXPECT_EQ(other.count("path"), 1);
+    EXPECT_EQ(other.report.approximations.at(APPROXIMATION_CLIP), 1);
 }
 
 } // namespace

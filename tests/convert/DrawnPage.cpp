@@ -56,21 +56,24 @@ std::string writePdf(const PageSource& source) {
 
 } // namespace
 
-DrawnPage::DrawnPage(const PageSource& source, const ConvertOptions& options) {
+DrawnPage::DrawnPage(const PageSource& source, const ConvertOptions& options,
+                     SVGConfig::SVGTYPE profile) {
     const TempDir directory;
     directory.write("page.pdf", writePdf(source));
-    draw(directory.path("page.pdf"), 0, options);
+    draw(directory.path("page.pdf"), 0, options, profile);
 }
 
 DrawnPage::DrawnPage(const std::string& path, int page, const ConvertOptions& options) {
-    draw(path, page, options);
+    draw(path, page, options, SVGConfig::SVGTYPE_FULL);
 }
 
-void DrawnPage::draw(const std::string& path, int page, const ConvertOptions& options) {
+void DrawnPage::draw(const std::string& path, int page, const ConvertOptions& options,
+                     SVGConfig::SVGTYPE profile) {
     DocumentConverter converter(options);
     converter.open(path, "");
     SVGConfig config;
     config.saveOption = u"decimals=3";
+    config.svgType = profile;
     SVGPageUri uri(u"");
     std::ostringstream stream;
     Drawmere drawmere(&config, &uri);

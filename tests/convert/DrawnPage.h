@@ -1,6 +1,7 @@
 /// A page of a document and what the converter draws of it.
 #pragma once
 
+#include "SVGConfig.h"
 #include "tools/convert/ConvertOptions.h"
 #include "tools/convert/PageReport.h"
 
@@ -22,8 +23,10 @@ struct PageSource {
 /// Draws a page into memory, with the library's defaults but three decimals.
 class DrawnPage {
 public:
-    explicit DrawnPage(const PageSource& source, const DrawmereConvert::ConvertOptions& options =
-                                                     DrawmereConvert::ConvertOptions());
+    explicit DrawnPage(
+        const PageSource& source,
+        const DrawmereConvert::ConvertOptions& options = DrawmereConvert::ConvertOptions(),
+        DrawmereNS::SVGConfig::SVGTYPE profile = DrawmereNS::SVGConfig::SVGTYPE_FULL);
 
     /// Draws a page, counted from 0, of the file `path`.
     DrawnPage(const std::string& path, int page,
@@ -48,7 +51,8 @@ public:
     DrawmereConvert::PageReport report;
 
 private:
-    void draw(const std::string& path, int page, const DrawmereConvert::ConvertOptions& options);
+    void draw(const std::string& path, int page, const DrawmereConvert::ConvertOptions& options,
+              DrawmereNS::SVGConfig::SVGTYPE profile);
 };
 
 } // namespace DrawmereTest

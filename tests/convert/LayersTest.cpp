@@ -7,6 +7,7 @@
 namespace DrawmereTest {
 namespace {
 
+using DrawmereNS::SVGConfig;
 using testing::HasSubstr;
 using testing::Not;
 
@@ -79,6 +80,21 @@ TEST(Layers, ATilingPatternIsAPattern) {
     EXPECT_EQ(page.attribute("path", "fill"), "url(#t0)");
     EXPECT_EQ(page.count("clipPath"), 0);
     EXPECT_EQ(page.report.countApproximations(), 0);
+}
+
+TEST(Layers, WithoutPatternsAndMasksWhatTheyPaintIsLeftOutAndCounted) {
+    const DrawnPage tiled(
+        {"/Pattern cs /P scn 10 10 80 80 re f",
+         "/Pattern<</P 5 0 R>>",
+         {{"/PatternType 1/PaintType 1/TilingType 1/BBox[0 0 9 9]/XStep 9/YStep 9/Resources<<>>",
+           "1 0 0 rg 0 0 5 5 re f"}}},
+        {}, SVGConfig::SVGTYPE_PLAZMIC);
+    EXPECT_EQ(tiled.count("rect"), 0);
+    EXPECT_EQ(tiled.report.approximations.at(DrawmereConvert::APPROXIMATION_PATTERN), 1);
+    const DrawnPage masked(makeMasked("0 0 99 99 re f", "10 10 50 50 re f"), {},
+                           SVGConfig::SVGTYPE_TINY);
+    EXPECT_EQ(masked.count("rect"), 1);
+    EXPECT_EQ(masked.report.approximations.at(DrawmereConvert::APPROXIMATION_MASK), 1);
 }
 
 TEST(Layers, APatternWhoseCellsOverlapIsCounted) {

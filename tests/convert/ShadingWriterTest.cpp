@@ -75,6 +75,13 @@ TEST(ShadingWriter, AMeshIsAnImageOfTheChosenResolution) {
     EXPECT_EQ(fine.report.approximations.at(APPROXIMATION_SHADING), 1);
 }
 
+TEST(ShadingWriter, WithoutGradientsAShadingHasTheColourBetweenItsEnds) {
+    const DrawnPage page({"/S sh", makeShading("2", "/Coords[0 0 200 0]/Extend[true true]")}, {},
+                         DrawmereNS::SVGConfig::SVGTYPE_TINY);
+    EXPECT_EQ(page.attribute("rect", "fill"), "#7f007f");
+    EXPECT_EQ(page.report.approximations.at(DrawmereConvert::APPROXIMATION_GRADIENT), 1);
+}
+
 TEST(ShadingWriter, AStrokeWithAShadingIsStrokedWithIt) {
     const DrawnPage page(
         {"/Pattern CS /P SCN 5 w 10 10 m 60 10 l 35 40 l S",

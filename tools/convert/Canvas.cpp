@@ -162,6 +162,18 @@ void Canvas::setEffects(const Effects& newEffects) {
     settings.setMask(effects.mask);
 }
 
+CLIPPING Canvas::getClipping() const {
+    switch (out.config->svgType) {
+    case SVGConfig::SVGTYPE_BASIC:
+        return CLIPPING_RECTANGLES;
+    case SVGConfig::SVGTYPE_TINY:
+    case SVGConfig::SVGTYPE_PLAZMIC:
+        return CLIPPING_NONE;
+    default:
+        return CLIPPING_ALL;
+    }
+}
+
 void Canvas::push() {
     flush();
     out.pushState();

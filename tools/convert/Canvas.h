@@ -10,6 +10,13 @@ namespace DrawmereConvert {
 /// would be written as one, so such a matrix gets a shift that can't be seen.
 SVGMatrix toMatrix(const fz_matrix& matrix);
 
+/// What the profile of the document can clip by.
+enum CLIPPING : std::int8_t {
+    CLIPPING_ALL,
+    CLIPPING_RECTANGLES,
+    CLIPPING_NONE,
+};
+
 /// What holds for a shape as a whole.
 struct Effects {
     bool operator==(const Effects&) const = default;
@@ -42,6 +49,11 @@ public:
     void setEffects(const Effects& newEffects);
 
     const Effects& getEffects() const { return effects; }
+
+    CLIPPING getClipping() const;
+
+    /// Returns: whether the profile of the document has masks and patterns.
+    bool hasDefinitions() const { return getClipping() != CLIPPING_NONE; }
 
     void push();
     void pop();

@@ -133,10 +133,26 @@ void ClipStack::openAll(const std::vector<ClipPtr>& clips) {
             report.note(APPROXIMATION_DEPTH);
             return;
         }
-        canvas.beginClip(clip->isRectangle ? toPath(clip->bounds) : clip->path, clip->isEvenOdd);
-        open.push_back(clip);
+        if (canvas.getClipping() == CLIPPING_NONE) {
+            report.note(APPROXIMATION_CLIP);
+            continue;
+        }
+        openOne(clip);
     }
 }
+
+// A profile that clips by rectangles alone would show nothing through another clip.
+void ClipStack::openOne(const ClipPtr& clip) {
+    const bool isWidened = !clip->isRectangle && canvas.getClipping() == CLIPPING_RECTANGLES;
+    if (isWidened) {
+        report.note(APPROXIMATION_CLIP);
+    }
+    const bool isBox = clip->isRectangle || isWidened;
+    canvas.beginClip(isBox ? toPath(clip->bounds) : clip->path, clip->isEvenOdd);
+    open.push_back(clip);
+}
+
+bool ClipStack::isCutByHand() const { return canvas.getClipping() == CLIPPING_NONE; }
 
 void ClipStack::leave() {
     for (; !open.empty(); open.pop_back()) {

@@ -45,6 +45,9 @@ public:
     /// Returns: the rectangle outside of which nothing shows, with or without the innermost clip.
     fz_rect getVisible(bool leavesOutTop = false) const;
 
+    /// Returns: whether `rect` has to be cut by its own corners, as no clip can be written.
+    bool isCutByHand() const;
+
     int countOpen() const { return static_cast<int>(open.size()); }
 
 private:
@@ -54,6 +57,7 @@ private:
     std::vector<ClipPtr> findCutting(const fz_rect& bounds, bool leavesOutTop) const;
     bool isActive(const ClipPtr& clip, bool leavesOutTop) const;
     void openAll(const std::vector<ClipPtr>& clips);
+    void openOne(const ClipPtr& clip);
 
     Canvas& canvas;
     PageReport& report;

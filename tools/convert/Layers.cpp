@@ -58,6 +58,7 @@ Layers::Scope& Layers::enterScope(const fz_rect& area) {
     auto scope = std::make_unique<Scope>(canvas, report, area, depth);
     scope->matrix = scopes.back()->matrix;
     scope->firstOpening = openings.size();
+    scope->isHidden = scopes.back()->isHidden;
     scopes.push_back(std::move(scope));
     return *scopes.back();
 }
@@ -126,6 +127,10 @@ void Layers::realize() {
 }
 
 void Layers::realizeStroke(Opening& opening) {
+    if (!canvas.hasDefinitions()) {
+        skipMask(opening);
+        return;
+    }
     const fz_rect area = roundOut(intersect(opening.area, clips().getVisible()));
     const UnicodeString id = canvas.beginMask(area);
     const StrokedPath& stroked = *opening.stroke;
@@ -141,7 +146,17 @@ void Layers::realizeStroke(Opening& opening) {
     openEffect(opening, {1, id}, area);
 }
 
+void Layers::skipMask(Opening& opening) {
+    report.note(APPROXIMATION_MASK);
+    opening.kind = OPENING_EFFECT;
+    opening.effects = canvas.getEffects();
+}
+
 void Layers::realizeImage(Opening& opening) {
+    if (!canvas.hasDefinitions()) {
+        skipMask(opening);
+        return;
+    }
     const fz_rect area = roundOut(intersect(opening.area, clips().getVisible()));
     const UnicodeString id = canvas.beginMask(area);
     if (opening.image->imagemask) {
@@ -160,7 +175,9 @@ void Layers::openEffect(Opening& opening, const Effects& effects, const fz_rect&
     const bool isForImages = effects.mask.isEmpty() || opening.facts.images == 0;
     const bool isFree = effects.mask.isEmpty() || canvas.getEffects().mask.isEmpty();
     const bool shows = opening.facts.objects > 0 && !isEmpty(area);
-    if (shows && (!opening.facts.isSimple() || !isForImages || !isFree)) {
+    const bool isOneByOne =
+        (opening.facts.isSimple() && isForImages && isFree) || !canvas.hasDefinitions();
+    if (shows && !isOneByOne) {
         openContainer(opening, effects, area);
         return;
     }
@@ -207,11 +224,14 @@ void Layers::beginMask(const fz_rect& area, bool isLuminosity,
     realize();
     const fz_rect visible = clips().getVisible();
     const fz_rect bounds = roundOut(backdrop ? visible : intersect(area, visible));
-    UnicodeString id = canvas.beginMask(bounds);
+    const bool isKnown = canvas.hasDefinitions();
+    UnicodeString id = isKnown ? canvas.beginMask(bounds) : UnicodeString();
     masks.push_back({bounds, colors.use});
     colors.use = isLuminosity ? COLORUSE_LUMINOSITY : COLORUSE_ALPHA;
-    enterScope(bounds).id = std::move(id);
-    if (backdrop) {
+    Scope& scope = enterScope(bounds);
+    scope.id = std::move(id);
+    scope.isHidden = scope.isHidden || !isKnown;
+    if (backdrop && isKnown) {
         canvas.fill(toPath(bounds), /*isEvenOdd=*/true, {*backdrop});
     }
 }
@@ -222,13 +242,17 @@ void Layers::endMask() {
     }
     realize();
     const UnicodeString id = leaveScope();
-    canvas.endMask();
     const OpenMask mask = masks.back();
     masks.pop_back();
     colors.use = mask.useBefore;
     Opening opening{OPENING_EFFECT, takeFacts()};
     clips().pushBounds(mask.area);
-    openEffect(opening, {1, id}, mask.area);
+    if (canvas.hasDefinitions()) {
+        canvas.endMask();
+        openEffect(opening, {1, id}, mask.area);
+    } else {
+        skipMask(opening);
+    }
     openings.push_back(std::move(opening));
 }
 
@@ -282,15 +306,18 @@ void Layers::beginTile(const fz_rect& area, const fz_rect& cell, float xStep, fl
     const float width = std::abs(xStep * inner.a);
     const float height = std::abs(yStep * inner.d);
     constexpr float allowed = 1.02F;
-    if (view.x1 - view.x0 > width * allowed || view.y1 - view.y0 > height * allowed) {
+    if (view.x1 - view.x0 > width * allowed || view.y1 - view.y0 > height * allowed ||
+        !canvas.hasDefinitions()) {
         report.note(APPROXIMATION_PATTERN);
     }
     const fz_rect repeated = {view.x0, view.y0, view.x0 + width, view.y0 + height};
     tiles.push_back({fz_transform_rect(area, matrix)});
-    UnicodeString id = canvas.beginPattern(repeated, own);
+    const bool isKnown = canvas.hasDefinitions();
+    UnicodeString id = isKnown ? canvas.beginPattern(repeated, own) : UnicodeString();
     const fz_matrix outer = scopes.back()->matrix;
     Scope& scope = enterScope(view);
     scope.id = std::move(id);
+    scope.isHidden = scope.isHidden || !isKnown;
     scope.matrix = fz_concat(outer, fz_invert_matrix(own));
     scope.clips.push(toPath(view), /*isEvenOdd=*/true);
 }
@@ -301,9 +328,12 @@ void Layers::endTile() {
     }
     realize();
     const UnicodeString id = leaveScope();
-    canvas.endPattern();
     const fz_rect area = tiles.back();
     tiles.pop_back();
+    if (!canvas.hasDefinitions()) {
+        return;
+    }
+    canvas.endPattern();
     fillClip(fz_transform_rect(area, scopes.back()->matrix), {MoxColor(), id});
 }
 
@@ -311,10 +341,13 @@ void Layers::endTile() {
 
 bool Layers::enter(const fz_rect& bounds) {
     realize();
-    return clips().enter(bounds);
+    return !scopes.back()->isHidden && clips().enter(bounds);
 }
 
 void Layers::fillClip(const fz_rect& bounds, const Paint& paint) {
+    if (scopes.back()->isHidden) {
+        return;
+    }
     const Opening* opening = getTop();
     if (opening && opening->kind == OPENING_STROKE && opening->stroke->matrices.isPlain) {
         const std::shared_ptr<StrokedPath> stroked = opening->stroke;
@@ -338,6 +371,13 @@ void Layers::fillClip(const fz_rect& bounds, const Paint& paint) {
     const fz_rect visible = intersect(bounds, clips().getVisible());
     if (!isEmpty(visible) && clips().enter(visible)) {
         canvas.fill(toPath(visible), /*isEvenOdd=*/true, paint);
+    }
+}
+
+void Layers::cutByHand(PathData& path) {
+    fz_rect rect{};
+    if (clips().isCutByHand() && path.isRectangle(rect)) {
+        path = toPath(intersect(rect, clips().getVisible()));
     }
 }
 

@@ -64,7 +64,9 @@ public:
     bool enter(const fz_rect& bounds);
 
     /// The same for the image that `findMaskOf` gave its mask to.
-    bool enterMasked(const fz_rect& bounds) { return clips().enter(bounds); }
+    bool enterMasked(const fz_rect& bounds) {
+        return !scopes.back()->isHidden && clips().enter(bounds);
+    }
 
     /// Fills what the innermost clip shows inside `bounds`.
     void fillClip(const fz_rect& bounds, const Paint& paint);
@@ -72,6 +74,9 @@ public:
     /// Returns: the mask that was opened last, when nothing has been drawn through it and it lies
     /// where `matrix` puts an image; null otherwise. The image then takes care of it.
     fz_image* findMaskOf(const fz_matrix& matrix);
+
+    /// Cuts off of the rectangle `path` what no clip can be written for.
+    void cutByHand(PathData& path);
 
     /// Returns: the part of the page that shows.
     fz_rect getVisible() { return clips().getVisible(); }
@@ -112,6 +117,7 @@ private:
         fz_matrix matrix = fz_identity; ///< from the page's coordinates to those here
         UnicodeString id;               ///< of the definition
         std::size_t firstOpening = 0;   ///< of those inside
+        bool isHidden = false;          ///< what the profile has no definition for
     };
 
     struct Opening {
@@ -139,6 +145,8 @@ private:
     /// Puts the mask that only the innermost opening says into the document.
     void realize();
     void realizeStroke(Opening& opening);
+    /// Goes on without a mask that the profile has none of.
+    void skipMask(Opening& opening);
     void realizeImage(Opening& opening);
     Scope& enterScope(const fz_rect& area);
     UnicodeString leaveScope();

@@ -38,6 +38,7 @@ void PagePainter::fillPath(const fz_path* path, bool isEvenOdd, const fz_matrix&
                            const Paint& paint) {
     current.clear();
     readPath(ctx, path, layers.place(matrix), current);
+    layers.cutByHand(current);
     if (!current.isEmpty() && layers.enter(current.getBounds())) {
         canvas.fill(current, isEvenOdd, paint);
     }
@@ -196,7 +197,13 @@ void PagePainter::fillShade(fz_shade* shade, const fz_matrix& matrix, float alph
         return;
     }
     fillBackground(*shade, area, alpha);
-    const UnicodeString id = shadings.define(shade, placed);
+    const bool hasGradients = canvas.hasDefinitions();
+    if (!hasGradients && shade->use_function && shade->type <= FZ_RADIAL) {
+        report.note(APPROXIMATION_GRADIENT);
+        layers.fillClip(area, {findMiddleColor(ctx, *shade, colors)});
+        return;
+    }
+    const UnicodeString id = hasGradients ? shadings.define(shade, placed) : UnicodeString();
     if (!id.isEmpty()) {
         layers.fillClip(area, {MoxColor(0, 0, 0, toByte(alpha)), id});
         return;

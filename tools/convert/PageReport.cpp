@@ -17,10 +17,12 @@ constexpr std::array<ApproximationWords, APPROXIMATION_COUNT> approximationWords
     {"overprint left out", "overprints left out"},
     {"mask approximated", "masks approximated"},
     {"shading drawn as an image", "shadings drawn as images"},
-    {"pattern with overlapping cells cut", "patterns with overlapping cells cut"},
+    {"shading drawn in one colour", "shadings drawn in one colour"},
+    {"pattern cut or left out", "patterns cut or left out"},
     {"image written in another form", "images written in another form"},
     {"text drawn as outlines", "texts drawn as outlines"},
     {"clip or group too deep", "clips or groups too deep"},
+    {"clip left out or widened", "clips left out or widened"},
 }};
 
 } // namespace

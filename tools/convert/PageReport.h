@@ -16,10 +16,12 @@ enum APPROXIMATION : std::int32_t {
     APPROXIMATION_OVERPRINT, ///< drawn without overprint
     APPROXIMATION_MASK,      ///< a mask put on parts one by one, or left out
     APPROXIMATION_SHADING,   ///< a shading drawn as an image
-    APPROXIMATION_PATTERN,   ///< a tiling pattern whose cells overlap, drawn cut off
+    APPROXIMATION_GRADIENT,  ///< a shading drawn in one colour, as the profile knows no more
+    APPROXIMATION_PATTERN,   ///< a pattern whose cells overlap, cut off, or that is left out
     APPROXIMATION_IMAGE,     ///< an image decoded and written in another form
     APPROXIMATION_TEXT,      ///< text drawn as outlines though the mode asks for text
     APPROXIMATION_DEPTH,     ///< a clip or group left out where elements nest too deep
+    APPROXIMATION_CLIP,      ///< something not cut, or cut straight, as the profile knows no more
     APPROXIMATION_COUNT,
 };
 

@@ -80,4 +80,11 @@ std::vector<ShadingStop> findStops(fz_context* ctx, const fz_shade& shade, Paint
     return stops;
 }
 
+MoxColor findMiddleColor(fz_context* ctx, const fz_shade& shade, PaintColors& colors) {
+    const Samples samples = readSamples(ctx, shade, colors);
+    const Sample& from = samples.front();
+    const Sample& to = samples.back();
+    return {(from[0] + to[0]) / 2, (from[1] + to[1]) / 2, (from[2] + to[2]) / 2};
+}
+
 } // namespace DrawmereConvert

@@ -18,4 +18,7 @@ struct ShadingStop {
 /// the shading is more than a 255th off.
 std::vector<ShadingStop> findStops(fz_context* ctx, const fz_shade& shade, PaintColors& colors);
 
+/// Returns: the colour between the first and the last of a shading.
+MoxColor findMiddleColor(fz_context* ctx, const fz_shade& shade, PaintColors& colors);
+
 } // namespace DrawmereConvert

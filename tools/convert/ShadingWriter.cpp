@@ -40,7 +40,7 @@ UnicodeString ShadingWriter::define(fz_shade* shade, const fz_matrix& matrix) {
             return known.id;
         }
     }
-    const UnicodeString id = make(*shade, fz_concat(shade->matrix, matrix));
+    UnicodeString id = make(*shade, fz_concat(shade->matrix, matrix));
     if (!id.isEmpty() && defined.size() < maxDefined) {
         defined.push_back({fz_keep_shade(ctx, shade), matrix, colors.use, id});
     }
