@@ -29,7 +29,7 @@ PartialFiles::~PartialFiles() {
 }
 
 std::string PartialFiles::makeRoom(int number) const {
-    const std::string room = place + std::to_string(number) + "/";
+    std::string room = place + std::to_string(number) + "/";
     fs::create_directory(room);
     return room;
 }
