@@ -96,7 +96,7 @@ DOCUMENTSTATE DocumentRun::checkFiles(const OutputNames& names) {
         }
         const std::string& owner = owners.emplace(file, input).first->second;
         if (owner != input) {
-            say(file + " would take the place of a page of " + owner);
+            say(std::string(file).append(" would take the place of a page of ").append(owner));
             return DOCUMENTSTATE_MISUSE;
         }
     }
