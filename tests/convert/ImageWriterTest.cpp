@@ -57,6 +57,28 @@ TEST(ImageWriter, ASmallStencilIsAPath) {
     EXPECT_EQ(page.attribute("path", "fill-rule"), "nonzero");
 }
 
+TEST(ImageWriter, AStencilForAShadingIsAPathFilledWithIt) {
+    PageSource source = makeImage("/Pattern cs /P scn 30 0 0 30 10 20 cm /I Do",
+                                  "/Width 3/Height 3/ImageMask true/BitsPerComponent 1",
+                                  std::string("\x00\x40\x00", 3));
+    source.resources += "/Pattern<</P<</PatternType 2/Shading<</ShadingType 2/ColorSpace/DeviceRGB"
+                        "/Coords[0 0 200 0]/Extend[true true]/Function<</FunctionType 2"
+                        "/Domain[0 1]/C0[1 0 0]/C1[0 0 1]/N 1>>>>>>>>";
+    const DrawnPage page(source);
+    EXPECT_EQ(page.count("mask"), 0);
+    EXPECT_EQ(page.attribute("path", "fill"), "url(#g0)");
+}
+
+TEST(ImageWriter, ASmallImageHasItsMaskInItself) {
+    PageSource source =
+        makeImage("40 0 0 30 10 20 cm /I Do", twoGrays + "/SMask 6 0 R", "\x10\xF0");
+    source.objects.emplace_back("/Type/XObject/Subtype/Image" + twoGrays, "\x40\x80");
+    const DrawnPage page(source);
+    EXPECT_EQ(page.count("mask"), 0);
+    EXPECT_EQ(page.count("image"), 1);
+    EXPECT_EQ(page.count("pattern"), 0);
+}
+
 /// Returns: the bytes of the first image in a document of this type.
 std::string findBytes(const std::string& svg, const std::string& type) {
     constexpr std::string_view digits =

@@ -70,7 +70,8 @@ void ImagePixels::readRow(int y, std::vector<std::uint32_t>& row) const {
     const unsigned char* samples = getRow(y);
     row.resize(static_cast<std::size_t>(pixmap->w));
     for (std::uint32_t& pixel : row) {
-        pixel = colors == 0 ? pack(0, 0, 0, *samples) : readPixel(samples, colors, hasAlpha);
+        pixel = colors == 0 ? pack(opaque, opaque, opaque, *samples)
+                            : readPixel(samples, colors, hasAlpha);
         samples += pixmap->n;
     }
 }

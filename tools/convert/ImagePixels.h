@@ -8,7 +8,7 @@
 
 namespace DrawmereConvert {
 
-/// Pixels as 0xAARRGGBB, colours not multiplied by alpha; of a mask only alpha counts.
+/// Pixels as 0xAARRGGBB, colours not multiplied by alpha; those of a mask are white.
 class ImagePixels {
 public:
     /// Decodes `image`, of its own size. Empty when it can't be decoded.

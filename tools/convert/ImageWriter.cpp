@@ -64,6 +64,12 @@ void ImageWriter::draw(fz_image* image, fz_image* mask, const fz_matrix& matrix,
     place(findFile({image, mask, use, 0, findZoom(*image, matrix)}), matrix, alpha);
 }
 
+bool ImageWriter::isPhotograph(fz_image* image) const {
+    constexpr std::size_t worthAMask = 16384;
+    const std::string stored = findStoredImage(ctx, image);
+    return stored.size() > worthAMask && stored.starts_with("\xFF\xD8");
+}
+
 void ImageWriter::drawStencil(fz_image* image, const fz_matrix& matrix, const MoxColor& color) {
     const float alpha = static_cast<float>(color.getAlpha()) / 255.0F;
     MoxColor solid = color;

@@ -30,6 +30,10 @@ public:
     /// null.
     void draw(fz_image* image, fz_image* mask, const fz_matrix& matrix, float alpha, COLORUSE use);
 
+    /// Returns: whether the file of `image` goes into the document as it is and is so much smaller
+    /// than its pixels that a mask is better kept apart.
+    bool isPhotograph(fz_image* image) const;
+
     /// Draws the shape of the mask `image` in one colour.
     void drawStencil(fz_image* image, const fz_matrix& matrix, const MoxColor& color);
 

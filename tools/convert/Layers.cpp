@@ -111,6 +111,11 @@ void Layers::pushImageMask(fz_image* image, const fz_matrix& matrix) {
     openings.push_back(std::move(opening));
 }
 
+void Layers::pushTracedMask(const PathData& path) {
+    nextGroup += isReplaying ? 0 : 1; // looking ahead counts it among the groups
+    pushClip(path, /*isEvenOdd=*/false);
+}
+
 fz_image* Layers::findMaskOf(const fz_matrix& matrix) {
     const Opening* top = getTop();
     const bool isMask = top && top->kind == OPENING_IMAGEMASK && isClose(top->matrix, matrix);

@@ -47,6 +47,8 @@ public:
     void pushClip(const PathData& path, bool isEvenOdd);
     void pushStrokeClip(StrokedPath stroked);
     void pushImageMask(fz_image* image, const fz_matrix& matrix);
+    /// The same for a mask that has become a path.
+    void pushTracedMask(const PathData& path);
     void beginMask(const fz_rect& area, bool isLuminosity, const std::optional<MoxColor>& backdrop);
     /// Goes on from the content of the mask to what is masked, up to `pop`.
     void endMask();

@@ -230,6 +230,9 @@ void PagePainter::fillBackground(const fz_shade& shade, const fz_rect& area, flo
 void PagePainter::fillImage(fz_image* image, const fz_matrix& matrix, float alpha) {
     const fz_matrix placed = layers.place(matrix);
     fz_image* mask = layers.findMaskOf(placed);
+    if (mask && canvas.hasDefinitions() && images.isPhotograph(image)) {
+        mask = nullptr;
+    }
     const fz_rect bounds = fz_transform_rect(fz_unit_rect, placed);
     const bool shows = mask ? layers.enterMasked(bounds) : layers.enter(bounds);
     if (shows) {
@@ -276,7 +279,12 @@ bool PagePainter::traceMask(fz_image* image, const fz_matrix& matrix) {
 }
 
 void PagePainter::clipImageMask(fz_image* image, const fz_matrix& matrix) {
-    layers.pushImageMask(image, layers.place(matrix));
+    const fz_matrix placed = layers.place(matrix);
+    if (traceMask(image, placed)) {
+        layers.pushTracedMask(current);
+    } else {
+        layers.pushImageMask(image, placed);
+    }
 }
 
 // Groups.
