@@ -38,6 +38,13 @@ TEST(OutlineText, RunsOfOneColourAreOnePath) {
     EXPECT_EQ(colored.count("path"), 2);
 }
 
+TEST(OutlineText, LongRunsAreWrittenInWholeNumbers) {
+    const DrawnPage page = drawText("(Hello) Tj", TEXTMODE_OUTLINES);
+    EXPECT_EQ(page.attribute("path", "transform"), "scale(0.01,0.01)");
+    EXPECT_EQ(page.attribute("path", "d").find('.'), std::string::npos);
+    EXPECT_EQ(drawText("(I) Tj", TEXTMODE_OUTLINES).attribute("path", "transform"), "(none)");
+}
+
 TEST(TextWriter, TextThatFollowsItsFontHasOnePosition) {
     const DrawnPage page = drawText("(Hello) Tj", TEXTMODE_FONTS);
     EXPECT_EQ(page.texts(), std::vector<std::string>{"Hello"});

@@ -1,13 +1,19 @@
 #include "tools/convert/Canvas.h"
 
+#include <cmath>
 #include <utility>
 
 namespace DrawmereConvert {
 namespace {
 
+constexpr std::size_t minScaledPoints = 40;
 constexpr std::size_t maxTextPoints = 20000; // no viewer likes endless paths
 
-MoxPointT<MoxLength> place(const fz_point& point) { return {pt(point.x), pt(point.y)}; }
+MoxPointT<MoxLength> place(const fz_point& point, float scale) {
+    return scale == 1 ? MoxPointT<MoxLength>(pt(point.x), pt(point.y))
+                      : MoxPointT<MoxLength>(pt(std::rint(point.x * scale)),
+                                             pt(std::rint(point.y * scale)));
+}
 
 MoxRectT<MoxLength> place(const fz_rect& rect) {
     return {pt(rect.x0), pt(rect.y0), pt(rect.x1), pt(rect.y1)};
@@ -55,8 +61,30 @@ void Canvas::flush() {
     }
     settings.setFill(waiting.paint);
     settings.setNoStroke();
-    drawShape(waiting.path, waiting.isEvenOdd, PAINTMODE_FILL);
+    if (isWorthScaling()) {
+        drawScaled();
+    } else {
+        drawShape(waiting.path, waiting.isEvenOdd, PAINTMODE_FILL);
+    }
     waiting.path.clear();
+}
+
+/// Returns: whether outlines of text are shorter with a matrix and whole numbers. A paint or mask
+/// would go through the matrix too, and lesser profiles have no room for such numbers.
+bool Canvas::isWorthScaling() const {
+    return waiting.isText && waiting.path.points.size() >= minScaledPoints &&
+           waiting.paint.id.isEmpty() && effects.mask.isEmpty() && getClipping() == CLIPPING_ALL;
+}
+
+void Canvas::drawScaled() {
+    countElement();
+    out.pushState();
+    settings.save(/*isDefinition=*/false);
+    transform(fz_scale(1 / PathData::stepsPerPoint, 1 / PathData::stepsPerPoint));
+    settings.setFillRule(FILLRULE_NONZERO);
+    drawPath(waiting.path, PAINTMODE_FILL, PathData::stepsPerPoint);
+    out.popState();
+    settings.restore();
 }
 
 void Canvas::stroke(const PathData& path, const Paint& paint, const Pen& pen) {
@@ -117,7 +145,7 @@ void Canvas::drawShape(const PathData& path, bool isEvenOdd, PAINTMODE mode) {
     drawPath(path, mode);
 }
 
-void Canvas::drawPath(const PathData& path, PAINTMODE mode) {
+void Canvas::drawPath(const PathData& path, PAINTMODE mode, float scale) {
     const bool isStroked = (mode & PAINTMODE_STROKE) != 0;
     const std::size_t count = path.steps.size();
     out.startPathData();
@@ -129,17 +157,18 @@ void Canvas::drawPath(const PathData& path, PAINTMODE mode) {
         switch (path.steps[i]) {
         case PATHSTEP_MOVE:
             start = point;
-            out.setPathMoveTo(place(*point++));
+            out.setPathMoveTo(place(*point++, scale));
             break;
         case PATHSTEP_LINE:
             // What closes goes back by itself.
             if (!closes || point->x != start->x || point->y != start->y) {
-                out.setPathLineTo(place(*point));
+                out.setPathLineTo(place(*point, scale));
             }
             ++point;
             break;
         case PATHSTEP_CURVE:
-            out.setPathCubicBezierCurveTo(place(point[0]), place(point[1]), place(point[2]));
+            out.setPathCubicBezierCurveTo(place(point[0], scale), place(point[1], scale),
+                                          place(point[2], scale));
             point += 3;
             break;
         case PATHSTEP_CLOSE:

@@ -101,7 +101,9 @@ private:
     void wait(const PathData& path, bool isEvenOdd, bool isText, const Paint& paint);
     void strokeWaiting(const Paint& paint, const Pen& pen);
     void drawShape(const PathData& path, bool isEvenOdd, PAINTMODE mode);
-    void drawPath(const PathData& path, PAINTMODE mode);
+    void drawPath(const PathData& path, PAINTMODE mode, float scale = 1);
+    bool isWorthScaling() const;
+    void drawScaled();
     void saveDefinition();
     void restoreDefinition();
 

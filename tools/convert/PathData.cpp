@@ -7,15 +7,13 @@
 namespace DrawmereConvert {
 namespace {
 
-constexpr float stepsPerPoint = 100.0F;
-
 // Documents use huge numbers for "everything"; beyond this a float has no hundredths anyway.
 constexpr float farAway = 100000.0F;
 
 float snap(float value) {
     // A NaN fails both comparisons and becomes the limit.
     const float near = value < farAway ? (value > -farAway ? value : -farAway) : farAway;
-    return std::rint(near * stepsPerPoint) / stepsPerPoint;
+    return std::rint(near * PathData::stepsPerPoint) / PathData::stepsPerPoint;
 }
 
 bool isSame(const fz_point& one, const fz_point& other) {

@@ -19,6 +19,8 @@ enum PATHSTEP : std::uint8_t {
 /// the library writes differences between them: so no error adds up along a path.
 class PathData {
 public:
+    static constexpr float stepsPerPoint = 100;
+
     void clear();
 
     bool isEmpty() const { return steps.empty(); }
