@@ -106,8 +106,11 @@ UnicodeString TextFont::makeName(int variant) const {
 
 std::unique_ptr<FS_ExtraFonts> TextFont::loadFile(const UnicodeString& fileName) const {
     const FT_Face face = faceOf(ctx, font);
-    // What MuPDF draws fatter or narrower than the file says is no longer the font of the file.
-    if (!face || !font->buffer || font->flags.fake_bold || font->flags.fake_italic) {
+    // What MuPDF draws fatter, slanted or narrower than the file says is no longer the font of the
+    // file.
+    const fz_font_flags_t& flags = font->flags;
+    if (!face || !font->buffer || flags.fake_bold || flags.fake_italic ||
+        (flags.ft_substitute && flags.ft_stretch)) {
         return nullptr;
     }
     unsigned char* data = nullptr;
