@@ -56,10 +56,12 @@ public:
         const Pattern wanted(FcPatternBuild(nullptr, FC_FAMILY, FcTypeString, name.c_str(),
                                             FC_STYLE, FcTypeString, "Regular", nullptr),
                              &FcPatternDestroy);
-        FcConfigSubstitute(nullptr, wanted.get(), FcMatchPattern);
+        const std::unique_ptr<FcConfig, decltype(&FcConfigDestroy)> fonts(
+            FcInitLoadConfigAndFonts(), &FcConfigDestroy);
+        FcConfigSubstitute(fonts.get(), wanted.get(), FcMatchPattern);
         FcDefaultSubstitute(wanted.get());
         FcResult result = FcResultNoMatch;
-        const Pattern found(FcFontMatch(nullptr, wanted.get(), &result), &FcPatternDestroy);
+        const Pattern found(FcFontMatch(fonts.get(), wanted.get(), &result), &FcPatternDestroy);
         open(found.get(), name);
     }
 
