@@ -18,7 +18,7 @@ namespace DrawmereNS {
 /// compressed data is complete only when the buffer is destroyed.
 class DRAWMERE_API SVGZipStreamBuf : public std::streambuf {
 public:
-    static constexpr std::size_t bufferSize = 15360;
+    static constexpr std::size_t bufferSize = 15360; ///< of each buffer, in bytes
 
     /// Writes to `target`. Borrows: `target`, until destruction, which flushes it and leaves it
     /// open.
@@ -59,11 +59,11 @@ public:
     /// Returns: 0, or -1 after a write error.
     int sync() override;
 
-    char inputBuffer[bufferSize] = {};
-    unsigned char outputBuffer[bufferSize];
-    std::ostream* target; // owned if `ownsTarget`, otherwise borrowed
-    bool ownsTarget;
-    std::unique_ptr<z_stream_s> zstream;
+    char inputBuffer[bufferSize] = {};      ///< the put area, what isn't deflated yet
+    unsigned char outputBuffer[bufferSize]; ///< what deflate made and isn't written yet
+    std::ostream* target;                   ///< owned if `ownsTarget`, otherwise borrowed
+    bool ownsTarget;                        ///< set by the constructor that takes a file name
+    std::unique_ptr<z_stream_s> zstream;    ///< the state of deflate
 
 private:
     void writeOutput(std::size_t count);
@@ -87,7 +87,7 @@ public:
     SVGZipStream& operator=(const SVGZipStream&) = delete;
     ~SVGZipStream() override;
 
-    SVGZipStreamBuf buffer;
+    SVGZipStreamBuf buffer; ///< what compresses and writes
 };
 
 } // namespace DrawmereNS

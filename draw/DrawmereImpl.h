@@ -104,9 +104,12 @@ public:
     /// Draws a rectangle; `rx` and `ry` round its corners unless both are 0.
     virtual void drawRect(MoxLength x, MoxLength y, MoxLength width, MoxLength height, MoxLength rx,
                           MoxLength ry, PAINTMODE mode);
+    /// Draws a circle.
     virtual void drawCircle(MoxLength cx, MoxLength cy, MoxLength r, PAINTMODE mode);
+    /// Draws an ellipse along the axes.
     virtual void drawEllipse(MoxLength cx, MoxLength cy, MoxLength rx, MoxLength ry,
                              PAINTMODE mode);
+    /// Draws a line; only its stroke shows.
     virtual void drawLine(MoxLength x1, MoxLength y1, MoxLength x2, MoxLength y2, PAINTMODE mode);
 
     /// Draws a polyline when `open` is set, otherwise a polygon.
@@ -133,6 +136,7 @@ public:
     /// Opens a link to `href`; what is drawn until `endLink` leads there. The name with the number
     /// 1073 as `show` asks for a new window.
     virtual void startLink(const UnicodeString& href, const MoxName& show);
+    /// Closes the link that was opened last.
     virtual void endLink();
 
     /// Opens a mask in `defs`; what is drawn until `endMask` becomes its content. The units are
@@ -205,14 +209,22 @@ public:
     /// the root says already.
     void setPaintAttr(SVGElement* element, PAINTMODE mode);
 
+    /// Opens a path; one that is open is drawn first, as the path before it was.
     void startPathData();
+    /// Draws the open path. Ignores: a call without one, and a path without segments.
     void endPathData(PAINTMODE mode);
+    /// Begins a subpath. This and the other segments are ignored without an open path.
     void setPathMoveTo(const MoxPointT<MoxLength>& point);
+    /// Closes the subpath.
     void setPathClosepath();
+    /// Adds a line.
     void setPathLineTo(const MoxPointT<MoxLength>& point);
+    /// Adds a curve with two control points, which ends in `point3`.
     void setPathCubicBezierCurveTo(const MoxPointT<MoxLength>& point1,
                                    const MoxPointT<MoxLength>& point2,
                                    const MoxPointT<MoxLength>& point3);
+    /// Adds a curve with one control point, which ends in `point2`. The segment behind it is
+    /// written relative to the origin: only a curve that ends its path comes out right.
     void setPathQuadraticBezierCurveTo(const MoxPointT<MoxLength>& point1,
                                        const MoxPointT<MoxLength>& point2);
 
@@ -229,18 +241,19 @@ public:
     MoxValue getInheritAttribute(const MoxElement* element, const MoxName& name,
                                  bool stopAtRoot) const;
 
-    SVGGroupManager* groupManager = nullptr;      // owned
-    SVGTreeManager* treeManager = nullptr;        // owned
-    SVGGroupManager* savedGroupManager = nullptr; // owned, while a path is open
-    SVGRefIDManager* refIdManager = nullptr;      // owned
-    UnicodeString clipPathId;
-    bool inClipDef = false;
-    PAINTMODE lastPathPaintMode = PAINTMODE_FILL;
-    SVGGraphicManager graphicManager;
-    SVGFontManager* fontManager = nullptr; // owned
-    SVGConfig* config;                     // borrowed
+    SVGGroupManager* groupManager = nullptr;      ///< owned
+    SVGTreeManager* treeManager = nullptr;        ///< owned
+    SVGGroupManager* savedGroupManager = nullptr; ///< owned, while a path is open
+    SVGRefIDManager* refIdManager = nullptr;      ///< owned
+    UnicodeString clipPathId;                     ///< of the clip path that was started last
+    bool inClipDef = false;                       ///< while a clip path is open
+    PAINTMODE lastPathPaintMode = PAINTMODE_FILL; ///< of the last path that reached the tree
+    SVGGraphicManager graphicManager;             ///< what becomes of images
+    SVGFontManager* fontManager = nullptr;        ///< owned
+    SVGConfig* config;                            ///< borrowed
 
 protected:
+    /// Returns: a new element of the document that stands nowhere yet.
     MoxPtr<SVGElement> createElement(SVGName name) const;
 
     /// Queues the text of `code`, one of 16428 to 16431, when the output is to be Tiny.

@@ -5,6 +5,8 @@
 
 namespace DrawmereNS {
 
+/// What SVG Basic can't show is dropped or clamped: coordinates of polygons beyond 32768, and what
+/// stands in clip paths besides rectangles.
 class DRAWMERE_API SVGBasicImpl : public DrawmereImpl {
 public:
     /// Borrows: `config`, for its own life.

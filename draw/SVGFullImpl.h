@@ -5,6 +5,7 @@
 
 namespace DrawmereNS {
 
+/// Everything goes through, but what may not stand in a clip path.
 class DRAWMERE_API SVGFullImpl : public DrawmereImpl {
 public:
     /// Borrows: `config`, for its own life.

@@ -27,15 +27,15 @@ public:
     /// Swaps the two ends with all that belongs to them.
     void replaceStartEnd();
 
-    std::uint64_t reserved = 0; ///< left alone by all operations
-    MoxColor startColor;
-    MoxColor endColor;
-    std::uint8_t startFlag = 0;
-    std::uint8_t endFlag = 0;
-    float startValue = 0.0F;
-    float endValue = 0.0F;
-    MoxPointT<MoxLength> startPoint;
-    MoxPointT<MoxLength> endPoint;
+    std::uint64_t reserved = 0;      ///< left alone by all operations
+    MoxColor startColor;             ///< of the start
+    MoxColor endColor;               ///< of the end
+    std::uint8_t startFlag = 0;      ///< of the start
+    std::uint8_t endFlag = 0;        ///< of the end
+    float startValue = 0.0F;         ///< of the start
+    float endValue = 0.0F;           ///< of the end
+    MoxPointT<MoxLength> startPoint; ///< where the step starts
+    MoxPointT<MoxLength> endPoint;   ///< where the step ends
 };
 
 } // namespace DrawmereNS

@@ -64,12 +64,12 @@ public:
                   const std::vector<MoxLength>& y, const std::vector<float>& rotation,
                   PAINTMODE mode, TLStringWithGlyphInfo* glyphs, bool wholeRun);
 
-    UnicodeString gradientId;
-    MoxColor lowStopColor;
-    MoxColor highStopColor;
-    bool noStopYet = true;
-    float highStopOffset = 0.0F;
-    float lowStopOffset = 0.0F;
+    UnicodeString gradientId;    ///< of the gradient that is open
+    MoxColor lowStopColor;       ///< of the stop with the lowest offset so far
+    MoxColor highStopColor;      ///< of the stop with the highest offset so far
+    bool noStopYet = true;       ///< until the gradient has a stop
+    float highStopOffset = 0.0F; ///< the highest so far
+    float lowStopOffset = 0.0F;  ///< the lowest so far
 
 private:
     bool isInDefinition() const;

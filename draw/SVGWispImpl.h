@@ -15,12 +15,12 @@ public:
     ~SVGWispImpl() override;
 
     // As in `SVGTinyImpl`, for classes derived from this one; nothing here changes them.
-    UnicodeString gradientId;
-    MoxColor lowStopColor;
-    MoxColor highStopColor;
-    bool noStopYet = true;
-    float highStopOffset = 0.0F;
-    float lowStopOffset = 0.0F;
+    UnicodeString gradientId;    ///< as in `SVGTinyImpl`
+    MoxColor lowStopColor;       ///< as in `SVGTinyImpl`
+    MoxColor highStopColor;      ///< as in `SVGTinyImpl`
+    bool noStopYet = true;       ///< as in `SVGTinyImpl`
+    float highStopOffset = 0.0F; ///< as in `SVGTinyImpl`
+    float lowStopOffset = 0.0F;  ///< as in `SVGTinyImpl`
 };
 
 } // namespace DrawmereNS

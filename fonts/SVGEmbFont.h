@@ -84,14 +84,14 @@ public:
     MoxPtr<SVGElement> convGlyph(const FS_GlyphDrawInfo& info, const UnicodeString& text,
                                  SVGTreeManager* tree, int& emptyCount);
 
-    FS_FontInfo fontInfo;
-    FONTATTRIBUTE fontAttribute;
-    UnicodeString faceFamily;
-    SVGGlyphMap horizontalGlyphs; // others may read both maps and add to them
-    SVGGlyphMap verticalGlyphs;
-    DrawmereErrHandler* errorHandler; // borrowed; for callers, nothing is reported to it
-    UnicodeString errorMessage;
-    std::map<UnicodeString, bool> reservedFlags; // stays empty
+    FS_FontInfo fontInfo;             ///< the face
+    FONTATTRIBUTE fontAttribute;      ///< of the first request; how text is collected, of the last
+    UnicodeString faceFamily;         ///< the value of font-family in the font
+    SVGGlyphMap horizontalGlyphs;     ///< others may read both maps and add to them
+    SVGGlyphMap verticalGlyphs;       ///< likewise
+    DrawmereErrHandler* errorHandler; ///< borrowed; for callers, nothing is reported to it
+    UnicodeString errorMessage;       ///< what `getErrorMessage` gives
+    std::map<UnicodeString, bool> reservedFlags; ///< stays empty
 
 private:
     void forgetCharacters();

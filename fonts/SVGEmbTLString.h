@@ -16,8 +16,11 @@ namespace DrawmereNS {
 class DRAWMERE_API SVGEmbTLString : public UnicodeString {
 public:
     SVGEmbTLString();
+    /// Takes a copy of `text`.
     explicit SVGEmbTLString(std::u16string_view text);
+    /// Copies the text.
     SVGEmbTLString(const SVGEmbTLString& other);
+    /// Copies the text.
     SVGEmbTLString& operator=(const SVGEmbTLString& other);
     ~SVGEmbTLString() override;
 

@@ -64,9 +64,9 @@ public:
     /// call from writing them once more.
     void doEmbedFonts();
 
-    SVGTreeManager* treeManager;       // borrowed
-    SVGEmbFont* currentFont = nullptr; // borrowed; null while the text's font is not carried
-    std::map<FONTATTRIBUTEKEY, SVGEmbFont*> embFonts; // owned, the fonts too
+    SVGTreeManager* treeManager;       ///< borrowed
+    SVGEmbFont* currentFont = nullptr; ///< borrowed; null while the text's font is not carried
+    std::map<FONTATTRIBUTEKEY, SVGEmbFont*> embFonts; ///< owned, the fonts too
 
 private:
     SVGEmbFont* findFont(const SVGFont& font, FS_ExtraFonts* extraFonts);

@@ -27,9 +27,9 @@ public:
     /// Returns: the count of the units. The argument plays no part.
     int getUniCount(unsigned short index) const;
 
-    unsigned short glyIndex;
-    char16_t* unicode = nullptr; // owned
-    std::int32_t uniCount;
+    unsigned short glyIndex;     ///< the number of the glyph
+    char16_t* unicode = nullptr; ///< owned
+    std::int32_t uniCount;       ///< as it was given
 };
 
 } // namespace DrawmereNS

@@ -21,11 +21,12 @@ enum BASE64INPUTTYPE : std::int32_t {
 /// leaves room for line ends of two bytes and a terminating zero.
 class DRAWMERE_API SVGBase64 {
 public:
+    /// The characters for 0 to 63.
     static constexpr char BASE64_ALPHABET[] =
         "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
 
     // What the encoding of files and streams answers.
-    static constexpr int SUCCESS = 0;
+    static constexpr int SUCCESS = 0;     ///< the text is complete
     static constexpr int NO_SOURCE = -20; ///< the source can't be opened
     static constexpr int NO_TARGET = -19; ///< the target can't be opened or written
     static constexpr int NO_MEMORY = -18; ///< no memory, or too small a buffer to write to

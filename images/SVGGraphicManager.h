@@ -129,25 +129,26 @@ public:
     void useEmbededImage(UnicodeString reference, MoxLength width, MoxLength height, MoxLength x,
                          MoxLength y); // sic
 
-    SVGTreeManager* treeManager = nullptr;                 // borrowed
-    SVGGroupManager* groupManager = nullptr;               // borrowed
-    SVGConfig* config = nullptr;                           // borrowed
+    SVGTreeManager* treeManager = nullptr;                 ///< borrowed
+    SVGGroupManager* groupManager = nullptr;               ///< borrowed
+    SVGConfig* config = nullptr;                           ///< borrowed
     std::map<UnicodeString, UnicodeString> embeddedImages; ///< references by original file name
-    char* encodedText = nullptr; // owned, in `encodedBlock`; null but between encoding and storing
-    SVGRefIDManager* refIdManager = nullptr; // borrowed
-    UnicodeString sourceBase;
-    UnicodeString targetBase;
+    /// Owned, in `encodedBlock`; null but between encoding and storing.
+    char* encodedText = nullptr;
+    SVGRefIDManager* refIdManager = nullptr; ///< borrowed
+    UnicodeString sourceBase;                ///< for `makeRefernceName`
+    UnicodeString targetBase;                ///< for `makeRefernceName`
     MoxPtr<MoxElement> imageParent;   ///< the cursor of the tree when the last image call began
-    DrawmereErrHandler* errorHandler; // borrowed; not called here
+    DrawmereErrHandler* errorHandler; ///< borrowed; not called here
     MoxName conversionName;           ///< as of `init`; the configuration itself is what counts
     int quality = 0;                  ///< likewise
     // Nothing fills or reads the rest.
-    std::map<UnicodeString, UnicodeString> unusedNames;
-    std::vector<UnicodeString> unusedList;
-    std::set<UnicodeString> unusedSet;
-    std::map<UnicodeString, UnicodeString> unusedReferences;
-    UnicodeString unusedText;
-    std::int32_t unusedCounter = 0;
+    std::map<UnicodeString, UnicodeString> unusedNames;      ///< stays empty
+    std::vector<UnicodeString> unusedList;                   ///< stays empty
+    std::set<UnicodeString> unusedSet;                       ///< stays empty
+    std::map<UnicodeString, UnicodeString> unusedReferences; ///< stays empty
+    UnicodeString unusedText;                                ///< stays empty
+    std::int32_t unusedCounter = 0;                          ///< stays 0
 
 private:
     void report(unsigned short message, const UnicodeString& name = UnicodeString()) const;

@@ -148,9 +148,13 @@ public:
     void setFillColorName(const UnicodeString& name);
     /// Sets the colour of later strokes, and its alpha as their opacity.
     void setStrokeColor(const MoxColor& color);
+    /// Strokes with a paint that is written as it stands.
     void setStrokeColorName(const UnicodeString& name);
+    /// Strokes with a gradient or pattern of this id, under Tiny too, which has none.
     void setStrokeColorId(const UnicodeString& id);
+    /// Sets the width of later strokes; one of 0 is written as "0.00001".
     void setStrokeWidth(MoxLength width);
+    /// Sets what is inside a shape that crosses itself; even-odd at the start of a document.
     void setFillRule(FILLRULE rule);
 
     /// Sets the font of later text. Borrows: both, for the call. Ignores: a null font.
@@ -159,7 +163,9 @@ public:
     void setOpacity(float value, OPACITYDEST dest);
     /// Masks later elements by the mask of this id; "none" ends that.
     void setMaskReference(UnicodeString id);
+    /// Sets where later text stands against its position.
     void setTextAnchor(TEXTANCHOR anchor);
+    /// Sets a line about later text.
     void setTextDecoration(TEXTDECORATION decoration);
     /// Sets the dash pattern of later strokes.
     /// Shape: `dashes[count]`, dash and gap in turn; a `count` below 1 empties the pattern.
@@ -167,9 +173,13 @@ public:
     void setDashLine(const MoxLength* dashes, int count, MoxLength offset);
     /// Stores the spacing between letters; it is not written.
     void setLetterSpacing(MoxLength spacing);
+    /// Sets what is added to each blank of later text.
     void setWordSpacing(MoxLength spacing);
+    /// Sets the ends of later strokes.
     void setLineCap(LINECAP cap);
+    /// Sets the corners of later strokes.
     void setLineJoin(LINEJOIN join);
+    /// Sets how long a mitre may be, as a multiple of the stroke's width; written as it stands.
     void setMiterLimit(float limit);
     /// Sets the writing mode of later text, by its name in SVG 1.1.
     void setWritingMode(MoxName mode);
@@ -178,15 +188,22 @@ public:
 
     // Paths. Between the two calls nothing else may be drawn or set: it is lost.
 
+    /// Opens a path; one that is open is drawn first.
     void startPathData();
     /// Draws the path. A path without segments draws nothing.
     void endPathData(PAINTMODE mode);
+    /// Begins a subpath. The first segment of a path is one of these.
     void setPathMoveTo(const MoxPointT<MoxLength>& point);
+    /// Adds a line.
     void setPathLineTo(const MoxPointT<MoxLength>& point);
+    /// Adds a curve with the control points `p1` and `p2`, which ends in `p3`.
     void setPathCubicBezierCurveTo(const MoxPointT<MoxLength>& p1, const MoxPointT<MoxLength>& p2,
                                    const MoxPointT<MoxLength>& p3);
+    /// Adds a curve with the control point `p1`, which ends in `p2`. A segment behind it goes
+    /// astray, so use cubic curves when more segments follow.
     void setPathQuadraticBezierCurveTo(const MoxPointT<MoxLength>& p1,
                                        const MoxPointT<MoxLength>& p2);
+    /// Closes the subpath.
     void setPathClosepath();
 
     // Clips.
@@ -207,11 +224,14 @@ public:
 
     // Shapes.
 
+    /// Draws a line; only its stroke shows.
     void drawLine(MoxLength x1, MoxLength y1, MoxLength x2, MoxLength y2, PAINTMODE mode);
     /// Draws a rectangle; `rx` and `ry` round its corners unless both are 0.
     void drawRect(MoxLength x, MoxLength y, MoxLength width, MoxLength height, MoxLength rx,
                   MoxLength ry, PAINTMODE mode);
+    /// Draws a circle.
     void drawCircle(MoxLength cx, MoxLength cy, MoxLength r, PAINTMODE mode);
+    /// Draws an ellipse along the axes.
     void drawEllipse(MoxLength cx, MoxLength cy, MoxLength rx, MoxLength ry, PAINTMODE mode);
     /// Shape: `points[count]`, x and y in turn; the last of an odd count is dropped.
     /// Units: points. Borrows: `points`, for the call; the Basic and Tiny profiles clamp them
@@ -227,6 +247,7 @@ public:
     void drawText(const UnicodeString& text, const std::vector<MoxLength>& x,
                   const std::vector<MoxLength>& y, const std::vector<float>& rotate, PAINTMODE mode,
                   TLStringWithGlyphInfo* glyphs, bool wholeRun, bool leftToRight);
+    /// Draws a run of text at one position.
     void drawText(const UnicodeString& text, MoxLength x, MoxLength y, PAINTMODE mode,
                   TLStringWithGlyphInfo* glyphs, bool wholeRun, bool leftToRight);
     /// Places an image. `type` has no effect. Borrows: `image`, for the call.
@@ -247,17 +268,22 @@ public:
     /// Opens a gradient, for stops alone: whatever else is drawn until `endGradiant` is lost.
     UnicodeString startLinearGradient(MoxLength x1, MoxLength y1, MoxLength x2, MoxLength y2,
                                       SVGMatrix matrix, UNITSTYPE units, GRADSPERADMOD spread);
+    /// The same with the ends as points.
     UnicodeString startLinearGradient(const MoxPointT<MoxLength>& from,
                                       const MoxPointT<MoxLength>& to, const SVGMatrix& matrix,
                                       UNITSTYPE units, GRADSPERADMOD spread);
+    /// Opens a gradient from the point `fx`, `fy` to a circle.
     UnicodeString startRadialGradient(MoxLength cx, MoxLength cy, MoxLength r, MoxLength fx,
                                       MoxLength fy, SVGMatrix matrix, UNITSTYPE units,
                                       GRADSPERADMOD spread);
     /// Adds a stop at `offset`, 0 to 1, with an opacity of its own; nothing is clamped or sorted.
     /// Ignores: a call outside a gradient.
     void setStopColor(const MoxColor& color, float offset, float opacity);
+    /// Closes the gradient.
     void endGradiant(); // sic
+    /// Closes the mask.
     void endMask();
+    /// Closes the pattern.
     void endPattern();
 
     // Links.
@@ -267,25 +293,26 @@ public:
     /// Opens the link that a map describes: under "internal" a map with a page number or a name,
     /// otherwise under "external" a URI, and under "show" how it opens.
     void startLink(const MoxValue& link);
+    /// Closes the link.
     void endLink();
     /// Makes a rectangle of the page a destination. Units: points.
     void setInternalView(UnicodeString name, float x, float y, float width, float height);
     /// Makes a point of the page a destination. Units: points.
     void setInternalLinkAnchor(UnicodeString name, float x, float y);
 
-    SVGConfig* config;                    // borrowed
-    SVGPageUri* pageUri;                  // borrowed
-    UnicodeString outputPath;             // empty in the stream form
-    std::ostream* outputStream = nullptr; // borrowed; null in the path form
-    DrawmereImpl* impl = nullptr;         // owned; null between documents
-    DrawmereErrHandler* errorHandler;     // borrowed
-    std::int32_t currentPage = 0;
-    std::int32_t firstPage = 0;
-    std::int32_t pageCount = 0;
-    std::set<UnicodeString> pageAnchors;               // of the page in progress
-    std::set<UnicodeString> allAnchors;                // of every ended page
-    std::map<UnicodeString, std::int32_t> anchorPages; // the first page to define each
-    std::map<std::int32_t, UnicodeString> pageFiles;   // names without directory
+    SVGConfig* config;                                 ///< borrowed
+    SVGPageUri* pageUri;                               ///< borrowed
+    UnicodeString outputPath;                          ///< empty in the stream form
+    std::ostream* outputStream = nullptr;              ///< borrowed; null in the path form
+    DrawmereImpl* impl = nullptr;                      ///< owned; null between documents
+    DrawmereErrHandler* errorHandler;                  ///< borrowed
+    std::int32_t currentPage = 0;                      ///< number of the last `startPage`
+    std::int32_t firstPage = 0;                        ///< number of the first `startPage`
+    std::int32_t pageCount = 0;                        ///< how many pages were started
+    std::set<UnicodeString> pageAnchors;               ///< of the page in progress
+    std::set<UnicodeString> allAnchors;                ///< of every ended page
+    std::map<UnicodeString, std::int32_t> anchorPages; ///< the first page to define each
+    std::map<std::int32_t, UnicodeString> pageFiles;   ///< names without directory
     /// Kept for `finish`. One in which the library made no link is taken to have none.
     std::map<std::int32_t, MoxPtr<MoxDocument>> documents;
 

@@ -15,8 +15,8 @@ using MoxCommonNS::MoxLength;
 /// written as "normal".
 using FONTWEIGHT = std::int32_t;
 
-constexpr FONTWEIGHT FONTWEIGHT_NORMAL = 400;
-constexpr FONTWEIGHT FONTWEIGHT_BOLD = 700;
+constexpr FONTWEIGHT FONTWEIGHT_NORMAL = 400; ///< The weight of plain text.
+constexpr FONTWEIGHT FONTWEIGHT_BOLD = 700;   ///< The weight of bold text.
 
 /// The slant of a font; an unlisted number is written as "normal".
 enum FSTYLE : std::int32_t {
@@ -47,15 +47,15 @@ enum FONTSTRECH : std::int32_t { // sic
 };
 
 // Font sizes that are keywords. No real size is negative, so these lengths are free to name them.
-constexpr MoxLength FONTSIZE_XXSMALL = MoxLength::fromRaw(-9.0F);
-constexpr MoxLength FONTSIZE_XSMALL = MoxLength::fromRaw(-8.0F);
-constexpr MoxLength FONTSIZE_SMALL = MoxLength::fromRaw(-7.0F);
-constexpr MoxLength FONTSIZE_MEDIUM = MoxLength::fromRaw(-6.0F);
-constexpr MoxLength FONTSIZE_LARGE = MoxLength::fromRaw(-5.0F);
-constexpr MoxLength FONTSIZE_XLARGE = MoxLength::fromRaw(-4.0F);
-constexpr MoxLength FONTSIZE_XXLARGE = MoxLength::fromRaw(-3.0F);
-constexpr MoxLength FONTSIZE_LARGER = MoxLength::fromRaw(-2.0F);
-constexpr MoxLength FONTSIZE_SMALLER = MoxLength::fromRaw(-1.0F);
+constexpr MoxLength FONTSIZE_XXSMALL = MoxLength::fromRaw(-9.0F); ///< "xx-small"
+constexpr MoxLength FONTSIZE_XSMALL = MoxLength::fromRaw(-8.0F);  ///< "x-small"
+constexpr MoxLength FONTSIZE_SMALL = MoxLength::fromRaw(-7.0F);   ///< "small"
+constexpr MoxLength FONTSIZE_MEDIUM = MoxLength::fromRaw(-6.0F);  ///< "medium"
+constexpr MoxLength FONTSIZE_LARGE = MoxLength::fromRaw(-5.0F);   ///< "large"
+constexpr MoxLength FONTSIZE_XLARGE = MoxLength::fromRaw(-4.0F);  ///< "x-large"
+constexpr MoxLength FONTSIZE_XXLARGE = MoxLength::fromRaw(-3.0F); ///< "xx-large"
+constexpr MoxLength FONTSIZE_LARGER = MoxLength::fromRaw(-2.0F);  ///< "larger"
+constexpr MoxLength FONTSIZE_SMALLER = MoxLength::fromRaw(-1.0F); ///< "smaller"
 
 /// The font-size-adjust that means none.
 constexpr MoxLength FONTADJUST_NONE = MoxLength::fromRaw(-1.0F);
@@ -70,19 +70,19 @@ public:
     /// Orders by name in UTF-16 code units, then by weight, then upright before slanted.
     bool operator<(const FONTATTRIBUTEKEY& other) const;
 
-    UnicodeString fontName; ///< the name by which the face is looked up
-    FONTWEIGHT fontWeight = FONTWEIGHT_NORMAL;
-    FSTYLE fontStyle = FSTYLE_NORMAL;
+    UnicodeString fontName;                    ///< the name by which the face is looked up
+    FONTWEIGHT fontWeight = FONTWEIGHT_NORMAL; ///< 1 to 1000
+    FSTYLE fontStyle = FSTYLE_NORMAL;          ///< upright or slanted
 };
 
 /// All that is known of a font. Copied by value; `operator==` is that of the key.
 class DRAWMERE_API FONTATTRIBUTE : public FONTATTRIBUTEKEY {
 public:
-    MoxLength fontSize = FONTSIZE_MEDIUM; ///< a length, or one of the `FONTSIZE_` keywords
-    MoxLength fontAdjust = FONTADJUST_NONE;
-    FVARIANT fontVariant = FVARIANT_NORMAL;
-    FONTSTRECH fontStretch = FONTSTRECH_NORMAL;
-    bool embedFont = false;     ///< embed this font as an SVG font
+    MoxLength fontSize = FONTSIZE_MEDIUM;       ///< a length, or one of the `FONTSIZE_` keywords
+    MoxLength fontAdjust = FONTADJUST_NONE;     ///< kept, not written
+    FVARIANT fontVariant = FVARIANT_NORMAL;     ///< kept, not written on texts
+    FONTSTRECH fontStretch = FONTSTRECH_NORMAL; ///< written, and chooses the face
+    bool embedFont = false;                     ///< embed this font as an SVG font
     bool embedGlyphIds = false; ///< when embedded, take the caller's glyph ids, not the characters
     UnicodeString fontFamily;   ///< the ready-made value of the attribute font-family
 };
@@ -106,6 +106,7 @@ public:
     /// Stores the variant; it is kept and not written on texts.
     void setFontVariant(FVARIANT variant) { fontVariant = variant; }
 
+    /// Stores the width of the face.
     void setFontStretch(FONTSTRECH stretch) { fontStretch = stretch; }
 };
 
@@ -114,14 +115,14 @@ class DRAWMERE_API SVGFontAttr2String {
 public:
     /// One text for each attribute; a new record describes no font in particular.
     struct FONTATTRSTRING {
-        UnicodeString fontName{u"user"};
-        UnicodeString fontSize{u"medium"};
-        UnicodeString fontAdjust{u"none"};
-        UnicodeString fontWeight{u"normal"};
-        UnicodeString fontStyle{u"normal"};
-        UnicodeString fontVariant{u"normal"};
-        UnicodeString fontStretch{u"normal"};
-        UnicodeString fontFamily;
+        UnicodeString fontName{u"user"};      ///< the name
+        UnicodeString fontSize{u"medium"};    ///< a number or a keyword
+        UnicodeString fontAdjust{u"none"};    ///< a number or "none"
+        UnicodeString fontWeight{u"normal"};  ///< a number or "normal"
+        UnicodeString fontStyle{u"normal"};   ///< a keyword
+        UnicodeString fontVariant{u"normal"}; ///< a keyword
+        UnicodeString fontStretch{u"normal"}; ///< a keyword
+        UnicodeString fontFamily;             ///< as it was set
     };
 
     /// Fills all of `out` from `font`.

@@ -32,14 +32,20 @@ public:
     /// The matrix of these numbers, classified.
     SVGMatrix(float newA, float newB, float newC, float newD, float newE, float newF);
 
+    /// A copy.
     SVGMatrix(const SVGMatrix&) = default;
+    /// Copies everything.
     SVGMatrix& operator=(const SVGMatrix&) = default;
     virtual ~SVGMatrix() = default;
 
+    /// Returns: `this` times the matrix of these numbers.
     SVGMatrix matrix(float rightA, float rightB, float rightC, float rightD, float rightE,
                      float rightF);
+    /// Returns: `this` after a shift by `x` and `y`.
     SVGMatrix translate(float x, float y);
+    /// Returns: `this` after a scaling by `factor`.
     SVGMatrix scale(float factor);
+    /// Returns: `this` after a scaling by `x` and `y`.
     SVGMatrix scaleNonUniform(float x, float y);
 
     /// Units: degrees, clockwise where y points down.
@@ -54,6 +60,7 @@ public:
     /// Units: degrees.
     SVGMatrix skewY(float degrees);
 
+    /// Returns: `this` times `right`.
     SVGMatrix multiply(const SVGMatrix& right);
 
     /// Returns: the inverse; the identity for a matrix that has none.
@@ -62,12 +69,12 @@ public:
     /// Classifies the matrix by its numbers, exactly as they are.
     void setType();
 
-    float a = 1.0F;
-    float b = 0.0F;
-    float c = 0.0F;
-    float d = 1.0F;
-    float e = 0.0F;
-    float f = 0.0F;
+    float a = 1.0F;               ///< x from x
+    float b = 0.0F;               ///< y from x
+    float c = 0.0F;               ///< x from y
+    float d = 1.0F;               ///< y from y
+    float e = 0.0F;               ///< x of the shift
+    float f = 0.0F;               ///< y of the shift
     int type = MATRIXTYPE_ROTATE; ///< a `MATRIXTYPE`, as `setType` found it last
 };
 

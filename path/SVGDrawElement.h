@@ -36,12 +36,15 @@ enum DrawmereDrawElementEnum : std::int32_t {
 /// for.
 class DRAWMERE_API SVGDrawElement : public MoxRCObject {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0x28116EDF;
     /// Room that the text of any segment fits into: a letter, six numbers and what parts them.
     static constexpr std::size_t maxText = 272;
 
+    /// Takes memory of segments.
     static void* operator new(std::size_t size) { return SVGSegmentHeap::allocate(size); }
 
+    /// Gives the memory back.
     static void operator delete(void* segment, std::size_t size) {
         SVGSegmentHeap::release(segment, size);
     }
@@ -53,11 +56,17 @@ public:
 
     // What a class does not override does nothing, or gives (0, 0).
 
+    /// Sets the target.
     virtual void setPoint(const MoxPointT<MoxLength>& newPoint);
+    /// Returns: the target.
     virtual MoxPointT<MoxLength> getPoint() const;
+    /// Sets the first control point.
     virtual void setPoint1(const MoxPointT<MoxLength>& newPoint);
+    /// Returns: the first control point.
     virtual MoxPointT<MoxLength> getPoint1() const;
+    /// Sets the second control point.
     virtual void setPoint2(const MoxPointT<MoxLength>& newPoint);
+    /// Returns: the second control point.
     virtual MoxPointT<MoxLength> getPoint2() const;
 
     /// Makes the points relative to `origin`; a coordinate that is a NaN stays as it is.
@@ -71,8 +80,10 @@ public:
     /// Shape: `out` has room for `maxText` characters. Returns: the end of the text.
     virtual char* writeText(char* out) const;
 
+    /// Stores a number that nothing reads.
     void setDrawType(DrawmereDrawElementEnum type) { drawType = type; }
 
+    /// Sets the command and its form.
     void setDrawName(DrawmereDrawElementEnum name) { drawName = name; }
 
     /// Returns: true for the absolute commands.
@@ -84,19 +95,22 @@ public:
     /// Writes x, a comma and y in the same way.
     static void makePointToStringValue(const MoxPointT<MoxLength>& point, char* buffer,
                                        unsigned long size);
+    /// Returns: the text of a length by the same rule.
     static UnicodeString makeLengthToStringValue(const MoxLength& length);
+    /// Returns: the text of a point by the same rule.
     static UnicodeString makePointToStringValue(const MoxPointT<MoxLength>& point);
 
-    DrawmereDrawElementEnum drawType = DRAWELEMENT_UNSET;
-    DrawmereDrawElementEnum drawName = DRAWELEMENT_UNSET;
+    DrawmereDrawElementEnum drawType = DRAWELEMENT_UNSET; ///< nothing reads it
+    DrawmereDrawElementEnum drawName = DRAWELEMENT_UNSET; ///< the command and its form
 
 protected:
+    /// A segment that begins with this letter.
     explicit SVGDrawElement(char commandLetter) : letter(commandLetter) {}
 
     /// The text of `writeText` with a terminator, kept until the next call.
     const char* makeText();
 
-    char letter;
+    char letter; ///< of the command
 
 private:
     std::unique_ptr<char[]> text; // made at the first `toString`
@@ -105,6 +119,7 @@ private:
 /// The end of a subpath.
 class DRAWMERE_API SVGDrawElementClose : public SVGDrawElement {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0xA9477E24;
 
     SVGDrawElementClose();
@@ -119,17 +134,21 @@ public:
 /// A segment with one point.
 class DRAWMERE_API SVGDrawElementPointTo : public SVGDrawElement {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0xE2EDBCC5;
 
     std::uint32_t getTypeID() const override;
     bool isA(std::uint32_t id) const override;
     const char* getTypeName() const override;
+    /// Sets the target.
     void setPoint(const MoxPointT<MoxLength>& newPoint) override;
+    /// Returns: the target.
     MoxPointT<MoxLength> getPoint() const override;
 
-    MoxPointT<MoxLength> point;
+    MoxPointT<MoxLength> point; ///< the target
 
 protected:
+    /// A segment that ends in `target`.
     SVGDrawElementPointTo(char commandLetter, const MoxPointT<MoxLength>& target)
         : SVGDrawElement(commandLetter), point(target) {}
 };
@@ -137,8 +156,10 @@ protected:
 /// The start of a subpath.
 class DRAWMERE_API SVGDrawElementMoveTo : public SVGDrawElementPointTo {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0x0136266E;
 
+    /// An absolute one.
     explicit SVGDrawElementMoveTo(const MoxPointT<MoxLength>& target);
     std::uint32_t getTypeID() const override;
     bool isA(std::uint32_t id) const override;
@@ -151,8 +172,10 @@ public:
 /// A line. A relative one that is horizontal or vertical takes the shorter command.
 class DRAWMERE_API SVGDrawElementLineTo : public SVGDrawElementPointTo {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0xFC9F018C;
 
+    /// An absolute one.
     explicit SVGDrawElementLineTo(const MoxPointT<MoxLength>& target);
     std::uint32_t getTypeID() const override;
     bool isA(std::uint32_t id) const override;
@@ -165,8 +188,10 @@ public:
 /// A curve with two control points and a target.
 class DRAWMERE_API SVGDrawElementCubicBezierCurveTo : public SVGDrawElement {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0xCE93740D;
 
+    /// An absolute one.
     SVGDrawElementCubicBezierCurveTo(const MoxPointT<MoxLength>& control1,
                                      const MoxPointT<MoxLength>& control2,
                                      const MoxPointT<MoxLength>& target);
@@ -175,17 +200,21 @@ public:
     const char* getTypeName() const override;
     /// Returns: the target. `setPoint` does nothing, as in the base.
     MoxPointT<MoxLength> getPoint() const override;
+    /// Sets the first control point.
     void setPoint1(const MoxPointT<MoxLength>& newPoint) override;
+    /// Returns: the first control point.
     MoxPointT<MoxLength> getPoint1() const override;
+    /// Sets the second control point.
     void setPoint2(const MoxPointT<MoxLength>& newPoint) override;
+    /// Returns: the second control point.
     MoxPointT<MoxLength> getPoint2() const override;
     void makeRelative(const MoxPointT<MoxLength>& origin) override;
     const char* toString() override;
     char* writeText(char* out) const override;
 
-    MoxPointT<MoxLength> point1;
-    MoxPointT<MoxLength> point2;
-    MoxPointT<MoxLength> point;
+    MoxPointT<MoxLength> point1; ///< the first control point
+    MoxPointT<MoxLength> point2; ///< the second control point
+    MoxPointT<MoxLength> point;  ///< the target
 };
 
 /// A curve with one control point and a target.
@@ -193,22 +222,26 @@ public:
 /// `getPoint` gives (0, 0). So the segment behind a quadratic one is relative to the origin.
 class DRAWMERE_API SVGDrawElementQuadraticBezierCurveTo : public SVGDrawElement {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0xAD56D32A;
 
+    /// An absolute one.
     SVGDrawElementQuadraticBezierCurveTo(const MoxPointT<MoxLength>& control,
                                          const MoxPointT<MoxLength>& target);
     std::uint32_t getTypeID() const override;
     bool isA(std::uint32_t id) const override;
     const char* getTypeName() const override;
+    /// Sets the control point.
     void setPoint2(const MoxPointT<MoxLength>& newPoint) override;
+    /// Returns: the control point.
     MoxPointT<MoxLength> getPoint2() const override;
     /// Leaves `drawName` alone, so `isAbsolute` stays true.
     void makeRelative(const MoxPointT<MoxLength>& origin) override;
     const char* toString() override;
     char* writeText(char* out) const override;
 
-    MoxPointT<MoxLength> point1;
-    MoxPointT<MoxLength> point2;
+    MoxPointT<MoxLength> point1; ///< the control point
+    MoxPointT<MoxLength> point2; ///< the target
 };
 
 } // namespace DrawmereNS

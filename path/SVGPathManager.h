@@ -29,6 +29,7 @@ public:
 
     /// Returns: the path data; a second call gives the same text.
     const UnicodeString& getPathSeg() override;
+    /// Lets go of all that was collected.
     void deletePathSeg() override;
 
     MoxValue takePathData() override;
@@ -40,8 +41,8 @@ public:
     /// Makes all segments relative but the first, which must be an absolute move.
     void makePathDataRealtive(); // sic
 
-    UnicodeString pathData;
-    std::vector<MoxPtr<SVGDrawElement>> segments;
+    UnicodeString pathData;                       ///< the finished text, or raw text
+    std::vector<MoxPtr<SVGDrawElement>> segments; ///< the commands in order
 
 private:
     /// Makes the segments relative and writes them behind each other, then lets go of them.

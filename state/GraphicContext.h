@@ -26,33 +26,34 @@ DRAWMERE_API void assignFont(SVGFont& to, const SVGFont& from);
 /// are "none"; taking SVG's would change what every comparison finds worth writing.
 struct DRAWMERE_API GraphicContext {
     GraphicContext() = default;
+    /// A copy.
     GraphicContext(const GraphicContext&) = default;
     ~GraphicContext() = default;
 
     /// Copies every member.
     GraphicContext& operator=(const GraphicContext& other);
 
-    UnicodeString strokeColor{u"none"};
-    MoxLength strokeWidth = MoxLength::fromRaw(1.0F);
-    LINECAP lineCap = LINECAP_BUTT;
-    LINEJOIN lineJoin = LINEJOIN_MITER;
-    std::vector<MoxLength> dashArray; ///< dash and gap in turn
-    MoxLength dashOffset;
-    float miterLimit = 4.0F;
-    float strokeOpacity = 1.0F;
-    UnicodeString maskReference{u"none"};
-    UnicodeString fillColor{u"none"};
-    UnicodeString fillRule{u"evenodd"};
-    float fillOpacity = 1.0F;
-    SVGFont font;
-    MoxLength letterSpacing; ///< kept, never written
-    MoxLength wordSpacing;
-    MoxName writingMode = MoxCommonNS::MOXNAME_LR_TB;
-    TEXTANCHOR textAnchor = TEXTANCHOR_UNSTATED;
-    TEXTDECORATION textDecoration = TEXTDECORATION_NONE;
-    CLIPRULE clipRule = CLIPRULE_EVENODD;
-    float opacity = 1.0F; ///< of the group or element as a whole
-    SVGMatrix transMatrix;
+    UnicodeString strokeColor{u"none"};                  ///< the ready-made value of stroke
+    MoxLength strokeWidth = MoxLength::fromRaw(1.0F);    ///< of strokes
+    LINECAP lineCap = LINECAP_BUTT;                      ///< the ends of strokes
+    LINEJOIN lineJoin = LINEJOIN_MITER;                  ///< the corners of strokes
+    std::vector<MoxLength> dashArray;                    ///< dash and gap in turn
+    MoxLength dashOffset;                                ///< where the dash pattern starts
+    float miterLimit = 4.0F;                             ///< a multiple of the width
+    float strokeOpacity = 1.0F;                          ///< of strokes
+    UnicodeString maskReference{u"none"};                ///< the ready-made value of mask
+    UnicodeString fillColor{u"none"};                    ///< the ready-made value of fill
+    UnicodeString fillRule{u"evenodd"};                  ///< the ready-made value of fill-rule
+    float fillOpacity = 1.0F;                            ///< of fills
+    SVGFont font;                                        ///< of text
+    MoxLength letterSpacing;                             ///< kept, never written
+    MoxLength wordSpacing;                               ///< of text
+    MoxName writingMode = MoxCommonNS::MOXNAME_LR_TB;    ///< of text
+    TEXTANCHOR textAnchor = TEXTANCHOR_UNSTATED;         ///< of text
+    TEXTDECORATION textDecoration = TEXTDECORATION_NONE; ///< of text
+    CLIPRULE clipRule = CLIPRULE_EVENODD;                ///< of shapes in clip paths
+    float opacity = 1.0F;                                ///< of the group or element as a whole
+    SVGMatrix transMatrix; ///< of the level that the record stands for
 };
 
 /// Returns: the record of the defaults that everything is compared with; it lives until the process

@@ -55,12 +55,14 @@ public:
 
     /// Sets the stroke's colour and its opacity, which is 1 for a colour without an alpha part.
     void setStrokeColor(const MoxColor& color);
+    /// Sets the stroke to a paint that is written as it stands.
     void setStrokeColorName(const UnicodeString& name);
     /// Sets the stroke to the paint defined under `id`, in every dialect.
     void setStrokeColorId(const UnicodeString& id);
 
     /// Sets the fill's colour and its opacity, which is 1 for a colour without an alpha part.
     void setFillColor(const MoxColor& color);
+    /// Sets the fill to a paint that is written as it stands.
     void setFillColorName(const UnicodeString& name);
     /// Sets the fill to the paint defined under `id`. Tiny has no references: there it is the solid
     /// colour noted for `id`, and "none" when there is none.
@@ -68,24 +70,34 @@ public:
 
     /// Sets one opacity as it stands, in range or not. Ignores: an unlisted destination.
     void setOpacity(float value, OPACITYDEST dest);
+    /// Sets the fill rule; every number but 1 means nonzero.
     void setFillRule(FILLRULE rule);
 
+    /// Sets the width of strokes.
     void setStrokeWidth(MoxLength width) { currentGC.strokeWidth = width; }
 
+    /// Sets how long a mitre may be.
     void setMiterLimit(float limit) { currentGC.miterLimit = limit; }
 
+    /// Stores the spacing between letters, which is not written.
     void setLetterSpacing(MoxLength spacing) { currentGC.letterSpacing = spacing; }
 
+    /// Sets what is added to each blank of text.
     void setWordSpacing(MoxLength spacing) { currentGC.wordSpacing = spacing; }
 
+    /// Sets the writing mode of text.
     void setWritingMode(MoxName mode) { currentGC.writingMode = mode; }
 
+    /// Sets where text stands against its position.
     void setTextAnchor(TEXTANCHOR anchor) { currentGC.textAnchor = anchor; }
 
+    /// Sets a line about text.
     void setTextDecoration(TEXTDECORATION decoration) { currentGC.textDecoration = decoration; }
 
+    /// Sets the ends of strokes.
     void setLineCap(LINECAP cap) { currentGC.lineCap = cap; }
 
+    /// Sets the corners of strokes.
     void setLineJoin(LINEJOIN join) { currentGC.lineJoin = join; }
 
     /// Sets the dash pattern and its offset.
@@ -93,6 +105,7 @@ public:
     /// pattern. Borrows: `lengths`, for the call.
     void setDashLine(const MoxLength* lengths, int count, MoxLength offset);
 
+    /// Sets the font of text.
     void setFont(const SVGFont& font) { assignFont(currentGC.font, font); }
 
     /// Sets the mask to the one defined under `id`; "none" takes it off.
@@ -101,8 +114,10 @@ public:
     /// Sets the clip path to the one defined under `id`.
     void setClipPathID(const UnicodeString& id);
 
+    /// Notes that something is clipped; nothing decides by it.
     void setClipState(bool state) { clipState = state; }
 
+    /// Sets the rule of shapes in clip paths.
     void setClipRuleAttrVal(CLIPRULE rule) { currentGC.clipRule = rule; }
 
     /// Multiplies the current matrix by `m`, which applies first from now on.
@@ -112,19 +127,25 @@ public:
     /// Sets which defined thing is being drawn, an `ELEMENT_TYPE`.
     void setType(int type) { elementType = type; }
 
+    /// Returns: an `ELEMENT_TYPE`.
     int getType() const { return elementType; }
 
     /// Sets the dialect: full, basic or tiny. It needs not be the profile of the configuration.
     void setSVGType(SVGConfig::SVGTYPE type) { svgType = type; }
 
+    /// Returns: the dialect.
     SVGConfig::SVGTYPE getSVGType() const { return svgType; }
 
+    /// Returns: the current font, borrowed.
     SVGFont* getFont() { return &currentGC.font; }
 
+    /// Returns: the current record, borrowed.
     GraphicContext* getCurrentGC() { return &currentGC; }
 
+    /// Returns: the record of the open group, borrowed.
     GraphicContext* getGroupGC() { return &groupGC; }
 
+    /// Replaces the record of the open group.
     void setGroupGC(const GraphicContext& record) { groupGC = record; }
 
     /// Makes the group's attributes the current ones. With `multiply` the current matrix moves into
@@ -178,16 +199,16 @@ public:
     /// matrix that says nothing writes nothing. Ignores: any other mode, and a null element.
     void setTransformAttr(SVGElement* element, int mode);
 
-    GraphicContext currentGC;
-    GraphicContext groupGC;
-    int elementType = ELEMENT_TYPE_NONE;
-    int changeCount = 0;      ///< counts fill rules; nothing decides by it
-    UnicodeString clipPathId; ///< the ready-made value of clip-path
-    bool clipState = false;
-    SVGConfig::SVGTYPE svgType = SVGConfig::SVGTYPE_FULL;
-    SVGMatrix rootMatrix;
+    GraphicContext currentGC;            ///< what the caller set last
+    GraphicContext groupGC;              ///< what the open group stands for
+    int elementType = ELEMENT_TYPE_NONE; ///< which defined thing is being drawn
+    int changeCount = 0;                 ///< counts fill rules; nothing decides by it
+    UnicodeString clipPathId;            ///< the ready-made value of clip-path
+    bool clipState = false;              ///< nothing decides by it
+    SVGConfig::SVGTYPE svgType = SVGConfig::SVGTYPE_FULL;  ///< the dialect
+    SVGMatrix rootMatrix;                                  ///< what stands at root level
     std::map<UnicodeString, UnicodeString> tinyFillColors; ///< for Tiny: an id, its solid colour
-    SVGConfig* config;                                     // borrowed
+    SVGConfig* config;                                     ///< borrowed
 
 private:
     /// What is written, and what it is compared with.

@@ -43,19 +43,27 @@ public:
 
     /// Returns: 0, and 4 for a manager that collects a path.
     virtual int getType() const;
+    /// Takes a segment of a path.
     virtual void appendPathCommand(SVGDrawElement* command);
+    /// Takes finished path data.
     virtual void addPathSeg(const UnicodeString& text, bool absolute);
 
     /// Returns: the path data, empty where none is collected; valid until the next change.
     virtual const UnicodeString& getPathSeg();
+    /// Lets go of all path data.
     virtual void deletePathSeg();
+    /// Keeps elements out, or lets them in again.
     virtual void addPathLock(bool lock);
+    /// Does nothing in any class.
     virtual void addStopElem(MoxElement* stop);
 
     /// Tells what kind of element comes next, which may close the open group.
     virtual void setElemMode(PAINTMODE mode, ELEMENTTYPE kind);
 
+    /// Closes the open group and saves the state.
     virtual void push(ELEMENT_TYPE type);
+    /// Closes the open group and takes the saved state back. Throws: MoxError 16406 or 16407 when
+    /// that is not what was saved last.
     virtual void pop(ELEMENT_TYPE type);
 
     /// Notes a scale that is saved and restored with the state; nothing is scaled by it.
@@ -89,14 +97,14 @@ public:
     /// Returns: the tree that groups go to, borrowed; null until the creator sets it.
     SVGTreeManager* getTreeManager() const { return treeManager; }
 
-    MoxPtr<SVGElement> groupElement;
-    SVGTreeManager* treeManager = nullptr; // borrowed
-    SVGGraphicContext* context;            // owned
-    bool pathLock = false;
+    MoxPtr<SVGElement> groupElement;             ///< the open group
+    SVGTreeManager* treeManager = nullptr;       ///< borrowed
+    SVGGraphicContext* context;                  ///< owned
+    bool pathLock = false;                       ///< while elements are kept out
     ELEMENTTYPE elementMode = ELEMENTTYPE_SHAPE; ///< the kind of the open group
     PAINTMODE paintMode = PAINTMODE_NONE;        ///< all modes seen in it; nothing decides by it
-    SVGConfig* config;                           // borrowed
-    FONTATTRIBUTE font;
+    SVGConfig* config;                           ///< borrowed
+    FONTATTRIBUTE font;                          ///< of the first text
 
 protected:
     /// Closes the open group when `kind` is another than its elements have, and notes the kind.

@@ -64,12 +64,12 @@ public:
 
     /// Who changes its tree from outside asks for it by `DrawmereImpl::getDocument`.
     MoxPtr<SVGDocument> document;
-    MoxPtr<SVGElement> currentNode;
-    std::deque<MoxPtr<MoxElement>> nodeStack; // kept, as callers may take them out of the tree
-    std::deque<SVGFont> fontStack;
-    SVGGraphicContext* context = nullptr; // borrowed
-    bool unlocked = true;
-    MoxPtr<SVGElement> defsElement;
+    MoxPtr<SVGElement> currentNode;             ///< where the next element goes
+    std::deque<MoxPtr<MoxElement>> nodeStack;   ///< kept, as callers may take them out of the tree
+    std::deque<SVGFont> fontStack;              ///< the fonts saved by `push`
+    SVGGraphicContext* context = nullptr;       ///< borrowed
+    bool unlocked = true;                       ///< false while a gradient takes stops only
+    MoxPtr<SVGElement> defsElement;             ///< once there is one
     std::vector<MoxPtr<SVGElement>> clipGroups; ///< all that came
 
 private:

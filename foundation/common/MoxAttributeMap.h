@@ -8,6 +8,7 @@ namespace MoxCommonNS {
 /// One attribute, borrowed from its element.
 class MoxAttribute {
 public:
+    /// Borrows: `attribute`.
     explicit MoxAttribute(const MoxValue& attribute) : value(&attribute) {}
 
     /// Returns: the qualified name of the attribute.
@@ -25,6 +26,7 @@ class MoxAttributeMap {
 public:
     MoxAttributeMap() = default;
 
+    /// Borrows: `attributes`, `length` of them.
     MoxAttributeMap(const MoxValue* attributes, int length) : first(attributes), count(length) {}
 
     /// Returns: how many attributes there are.
@@ -35,8 +37,10 @@ public:
         return MoxAttribute(index >= 0 && index < count ? first[index] : MoxValue::NULL_VALUE);
     }
 
+    /// Returns: the first value, for loops over all; each carries its name as its key.
     const MoxValue* begin() const { return first; }
 
+    /// Returns: the place behind the last value.
     const MoxValue* end() const { return first + count; }
 
 private:

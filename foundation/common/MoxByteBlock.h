@@ -7,7 +7,9 @@
 
 namespace MoxCommonNS {
 
+/// Gives memory of `makeZeroBlock` back.
 struct MoxByteBlockDeleter {
+    /// Frees `bytes`, which may be null.
     void operator()(char* bytes) const { std::free(bytes); }
 };
 

@@ -18,7 +18,9 @@ public:
     /// Takes a copy of `text`; the bytes are UTF-8 until `setEncoding` says something else.
     MoxCStr(const UnicodeString& text); // NOLINT(google-explicit-constructor): any text is one
 
+    /// A copy.
     MoxCStr(const MoxCStr& other) = default;
+    /// Copies everything.
     MoxCStr& operator=(const MoxCStr& other) = default;
     ~MoxCStr() override;
 
@@ -27,6 +29,7 @@ public:
 
     /// Names the encoding of the bytes, any that ICU knows; a null or unknown one reads as UTF-8.
     void setEncoding(const char* name);
+    /// Returns: the name of the encoding.
     const std::string& getEncoding() const;
 
     /// Returns: the text in the encoding.

@@ -28,12 +28,16 @@ public:
     constexpr MoxColor(unsigned int rgb) // NOLINT(google-explicit-constructor): a way to write one
         : packed(rgb) {}
 
+    /// Returns: 0 to 255.
     constexpr int getRed() const { return component(16); }
 
+    /// Returns: 0 to 255.
     constexpr int getGreen() const { return component(8); }
 
+    /// Returns: 0 to 255.
     constexpr int getBlue() const { return component(0); }
 
+    /// Returns: 0, transparent, to 255, opaque.
     constexpr int getAlpha() const { return static_cast<int>(opaque) - component(24); }
 
     /// Returns: the packed form 0xTTRRGGBB.
@@ -52,9 +56,10 @@ public:
     /// which is left out otherwise; `numbersOnly` for no names.
     UnicodeString toString(bool css, bool withAlpha, bool numbersOnly) const;
 
+    /// True when both are the same.
     constexpr bool operator==(const MoxColor&) const = default;
 
-    std::uint32_t packed = 0;
+    std::uint32_t packed = 0; ///< 0xTTRRGGBB
 
 private:
     static constexpr std::uint32_t opaque = 255;

@@ -10,6 +10,7 @@ namespace MoxCommonNS {
 /// A document node. It has at most one child, the document element.
 class DRAWMERE_API MoxDocument : public MoxNode {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0x2A780AB6;
 
     MoxDocument();
@@ -20,6 +21,7 @@ public:
     bool isA(std::uint32_t id) const override;
     const char* getTypeName() const override;
     MoxName getNodeName() const override;
+    /// Returns: "#document".
     MoxName getLocalName() const override;
 
     /// Returns: the root element or null.

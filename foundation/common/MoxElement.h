@@ -9,6 +9,7 @@ namespace MoxCommonNS {
 /// 65,535 attributes; one more throws std::bad_alloc and changes nothing.
 class DRAWMERE_API MoxElement : public MoxNode {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0x9B60777D;
 
     /// An element of `document` that has no name yet; `MoxDocument::createElement` gives it one.
@@ -20,6 +21,7 @@ public:
     bool isA(std::uint32_t id) const override;
     const char* getTypeName() const override;
     MoxName getNodeName() const override;
+    /// Returns: the local name.
     MoxName getLocalName() const override;
     MoxName getPrefix() const override;
     MoxAttributeMap getAttributes() const override;
@@ -34,7 +36,9 @@ public:
 
     /// Sets or replaces an attribute. Ignores: a null value and the name 0.
     virtual void setAttribute(MoxName name, const MoxValue& value);
+    /// Removes an attribute. Ignores: one that is not set.
     virtual void removeAttribute(MoxName name);
+    /// Returns: whether the attribute is set.
     virtual bool hasAttribute(MoxName name) const;
 
     /// The same as the virtual form for a value that nobody needs any longer.
@@ -47,10 +51,13 @@ public:
     MoxName getNamespaceURI() const { return uri; }
 
     // Plain readings for walks that can't afford a virtual call for each step.
+    /// Returns: the local name.
     MoxName localLink() const { return local; }
 
+    /// Returns: the prefix, 0 for none.
     MoxName prefixLink() const { return prefix; }
 
+    /// Returns: the attributes.
     MoxAttributeMap attributeLinks() const { return {attributes, attributeCount}; }
 
 protected:

@@ -24,7 +24,9 @@ public:
              const UnicodeString& sourceName, int lineNumber, int columnNumber,
              const UnicodeString& extraText);
 
+    /// A copy.
     MoxError(const MoxError& other) = default;
+    /// Copies everything.
     MoxError& operator=(const MoxError& other) = default;
     ~MoxError() override;
 
@@ -34,11 +36,17 @@ public:
     /// Throws: a copy of this record, as a `MoxError` whatever the record's own class is.
     [[noreturn]] void throwFatalError() const;
 
+    /// Returns: the code, 0 for an empty record.
     unsigned short getCode() const;
+    /// Returns: the message.
     const UnicodeString& getMessage() const;
+    /// Returns: the name of what the fault lies in, empty when unknown.
     const UnicodeString& getSource() const;
+    /// Returns: the line, -1 when unknown.
     int getLine() const;
+    /// Returns: the column, -1 when unknown.
     int getColumn() const;
+    /// Returns: what more there is to say.
     const UnicodeString& getExtra() const;
 
     /// Returns: the message in UTF-8, valid until the record dies or its message is replaced.

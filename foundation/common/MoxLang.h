@@ -29,6 +29,7 @@ public:
     /// Returns: true for the root language, and for a locale that ICU holds for broken.
     bool isRoot() const;
 
+    /// True when both are the same.
     bool operator==(const MoxLang& other) const;
 
 private:

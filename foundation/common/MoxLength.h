@@ -32,7 +32,7 @@ public:
     /// Exact: lengths are equal when their numbers are.
     constexpr bool operator==(const MoxLength&) const = default;
 
-    float value = 0.0F;
+    float value = 0.0F; ///< in points, or a keyword of `SVGFont`
 
 private:
     /// A ratio of whole numbers, so that a conversion is one exact product and one quotient.

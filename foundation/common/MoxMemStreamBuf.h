@@ -11,8 +11,8 @@ namespace MoxCommonNS {
 
 /// The bytes a memory stream gave up.
 struct MoxMemBytes {
-    std::unique_ptr<char[]> data; // null when there are none
-    std::size_t size = 0;         // in bytes; what may lie behind them is of no meaning
+    std::unique_ptr<char[]> data; ///< null when there are none
+    std::size_t size = 0;         ///< in bytes; what may lie behind them is of no meaning
 };
 
 /// Keeps all that is written to it; the same bytes are there to be read.
@@ -45,12 +45,19 @@ public:
     const char* getData() const;
 
 protected:
+    // What std::streambuf asks for.
+    /// Makes the next byte readable. Returns: it, or the end-of-file value.
     int_type underflow() override;
+    /// Makes room and stores a byte. Returns: it, or the end-of-file value without memory.
     int_type overflow(int_type character) override;
+    /// Returns: how many bytes can be read, -1 for none.
     std::streamsize showmanyc() override;
+    /// Stores `count` bytes. Returns: how many found room.
     std::streamsize xsputn(const char* text, std::streamsize count) override;
+    /// Moves the places of reading and writing. Returns: the new one, -1 beyond the bytes.
     pos_type seekoff(off_type offset, std::ios_base::seekdir from,
                      std::ios_base::openmode which) override;
+    /// The same from the beginning.
     pos_type seekpos(pos_type position, std::ios_base::openmode which) override;
 
 private:

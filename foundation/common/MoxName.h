@@ -25,11 +25,13 @@ public:
         return MoxName(static_cast<MoxNameEnum>(number));
     }
 
+    /// True when both are the same.
     constexpr bool operator==(const MoxName&) const = default;
 
+    /// Returns: whether it is a name; 0 is none.
     constexpr explicit operator bool() const { return number != 0; }
 
-    std::uint32_t number = 0;
+    std::uint32_t number = 0; ///< of the text in the shared table
 };
 
 } // namespace MoxCommonNS

@@ -16,6 +16,7 @@ namespace MoxCommonNS {
 /// names of SVG 1.1 first, in their alphabetical order.
 class DRAWMERE_API MoxNameTable {
 public:
+    /// Texts without a fixed number get numbers from here on.
     static constexpr std::uint32_t firstFreeNumber = 4096;
 
     /// What the table holds for one name.
@@ -28,7 +29,7 @@ public:
         /// Whether `xmlName` is the text itself, of ASCII characters only, and declares no
         /// namespace. Every other name needs a closer look before it is written.
         bool isPlain = false;
-        UnicodeString text;
+        UnicodeString text; ///< one interned text
     };
 
     /// Returns: the text of `name`, empty for 0 and for a number that was never given out.

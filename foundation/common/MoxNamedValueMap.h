@@ -14,7 +14,9 @@ class MoxValue;
 class DRAWMERE_API MoxNamedValueMap {
 public:
     MoxNamedValueMap();
+    /// A copy.
     MoxNamedValueMap(const MoxNamedValueMap&);
+    /// Copies everything.
     MoxNamedValueMap& operator=(const MoxNamedValueMap&);
     ~MoxNamedValueMap();
 

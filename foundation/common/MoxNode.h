@@ -23,14 +23,17 @@ enum MoxNodeType : std::uint8_t {
 /// does holds it in a `MoxPtr`. No operation recurses by the depth of the tree.
 class DRAWMERE_API MoxNode : public MoxNodeIterable {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0xFF72074A;
 
     /// Lets go of all children.
     ~MoxNode() override;
 
     // Nodes stand in the memory of trees.
+    /// Takes memory of trees.
     static void* operator new(std::size_t size) { return MoxNodeHeap::allocate(size); }
 
+    /// Gives the memory back.
     static void operator delete(void* node, std::size_t size) { MoxNodeHeap::release(node, size); }
 
     std::uint32_t getTypeID() const override;
@@ -39,6 +42,7 @@ public:
 
     /// Returns: the qualified name: prefix, colon and local name, or the local name alone.
     virtual MoxName getNodeName() const;
+    /// Returns: the name without its prefix.
     virtual MoxName getLocalName() const;
     /// Returns: the prefix, 0 when there is none.
     virtual MoxName getPrefix() const;
@@ -46,10 +50,15 @@ public:
     virtual MoxValue getNodeValue() const;
     /// Returns: 1 element, 3 text, 9 document.
     virtual int getNodeType() const;
+    /// Returns: the parent, borrowed, or null.
     virtual MoxNode* getParentNode() const;
+    /// Returns: whether there are children.
     virtual bool hasChildNodes() const;
+    /// Returns: the first child, borrowed, or null.
     virtual MoxNode* getFirstChild() const;
+    /// Returns: the neighbour before this node, borrowed, or null.
     virtual MoxNode* getPreviousSibling() const;
+    /// Returns: the neighbour behind this node, borrowed, or null.
     virtual MoxNode* getNextSibling() const;
     /// Returns: the document, borrowed; null when the node was made without one, and when the
     /// document is no more.
@@ -77,7 +86,9 @@ public:
 
     /// Returns: a copy of the node, without a parent; of all below it too when `deep` is set.
     virtual MoxPtr<MoxNode> cloneNode(bool deep) const;
+    /// Returns: true for an element.
     virtual bool isElementNode() const;
+    /// Returns: true for a text.
     virtual bool isText() const;
     /// Returns: whether a text is saved with a tag of its own; no text of this library is.
     virtual bool saveTextTag() const;
@@ -92,15 +103,20 @@ public:
     MoxTreeIterator getIterator() const;
 
     // Plain readings of the links, for walks that can't afford a virtual call for each step.
+    /// Returns: the parent, borrowed, or null.
     MoxNode* parentLink() const { return parent; }
 
+    /// Returns: the first child, borrowed, or null.
     MoxNode* firstLink() const { return firstChild; }
 
+    /// Returns: the neighbour behind this node, borrowed, or null.
     MoxNode* nextLink() const { return nextSibling; }
 
+    /// Returns: what the node is.
     MoxNodeType kindLink() const { return kind; }
 
 protected:
+    /// A node of `document`, which may be null.
     MoxNode(MoxNodeType nodeKind, MoxDocument* document);
 
     /// The copy of this node alone, for `cloneNode`.
@@ -140,6 +156,7 @@ template <typename T> T* narrow(MoxNode* node) {
     return node && node->isA(T::typeId) ? static_cast<T*>(node) : nullptr;
 }
 
+/// The same for a node that is not to be changed.
 template <typename T> const T* narrow(const MoxNode* node) {
     return node && node->isA(T::typeId) ? static_cast<const T*>(node) : nullptr;
 }

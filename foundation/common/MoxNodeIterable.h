@@ -8,6 +8,7 @@ namespace MoxCommonNS {
 /// A counted object whose nodes can be walked.
 class DRAWMERE_API MoxNodeIterable : public MoxRCObject {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0x6D959880;
 
     std::uint32_t getTypeID() const override;

@@ -10,6 +10,7 @@ namespace MoxCommonNS {
 /// Base of every object that can be asked for its class by a fixed 32-bit number.
 class DRAWMERE_API MoxObjectBase {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0xDF537371;
 
     MoxObjectBase() = default;

@@ -8,12 +8,14 @@ template <typename T> class MoxPointT {
 public:
     constexpr MoxPointT() = default;
 
+    /// A point from its coordinates.
     constexpr MoxPointT(const T& xValue, const T& yValue) : x(xValue), y(yValue) {}
 
+    /// True when both are the same.
     constexpr bool operator==(const MoxPointT&) const = default;
 
-    T x = T();
-    T y = T();
+    T x = T(); ///< to the right
+    T y = T(); ///< downwards on pages
 };
 
 } // namespace MoxCommonNS

@@ -10,6 +10,7 @@ namespace MoxCommonNS {
 /// `MoxPtr` takes it to 1.
 class DRAWMERE_API MoxRCObject : public MoxObjectBase {
 public:
+    /// What `isA` and `getTypeID` know this class by.
     static constexpr std::uint32_t typeId = 0xD18D040A;
 
     std::uint32_t getTypeID() const override;

@@ -8,6 +8,7 @@ namespace MoxCommonNS {
 /// Characters between tags. The text is kept as a value, so plain ASCII takes a byte a character.
 class DRAWMERE_API MoxText : public MoxNode {
 public:
+    /// A text of `document`, which may be null.
     MoxText(MoxDocument* document, const UnicodeString& text);
 
     const char* getTypeName() const override;

@@ -13,6 +13,7 @@ public:
     /// Borrows: `root`, which may be null for an empty walk.
     explicit MoxTreeIterator(const MoxNode* root);
 
+    /// Returns: whether a node is left.
     bool hasNextNode() const { return next != nullptr; }
 
     /// Returns: the next node, or null at the end.

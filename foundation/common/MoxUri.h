@@ -33,11 +33,15 @@ public:
     MoxUri(const MoxUri& base, const UnicodeString& relative, URISTRTYPE type,
            const MoxXmlCatalogs* catalogs);
 
+    /// A copy.
     MoxUri(const MoxUri& other) = default;
+    /// Copies everything.
     MoxUri& operator=(const MoxUri& other) = default;
     virtual ~MoxUri();
 
+    /// Returns: the text.
     const UnicodeString& getText() const;
+    /// Replaces the text.
     void setText(const UnicodeString& newText);
 
     /// Returns: the local path of `text`; see the other form.

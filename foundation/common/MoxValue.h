@@ -40,34 +40,42 @@ public:
 
     constexpr MoxValue() = default;
 
+    /// A string.
     MoxValue(const UnicodeString& text) { // NOLINT(google-explicit-constructor): values are its use
         storeText(viewOf(text));
     }
 
+    /// A string.
     MoxValue(std::u16string_view text) { // NOLINT(google-explicit-constructor)
         storeText(text);
     }
 
+    /// A string, up to its terminator.
     MoxValue(const char16_t* text) { // NOLINT(google-explicit-constructor)
         storeText(text);
     }
 
+    /// A name.
     MoxValue(MoxName name) { // NOLINT(google-explicit-constructor)
         store(MOXVALUE_NAME, name.number);
     }
 
+    /// A length.
     MoxValue(MoxLength length) { // NOLINT(google-explicit-constructor)
         store(MOXVALUE_LENGTH, length.getRawValue());
     }
 
+    /// A colour.
     MoxValue(MoxColor color) { // NOLINT(google-explicit-constructor)
         store(MOXVALUE_COLOR, color.getPacked());
     }
 
+    /// An integer.
     MoxValue(int number) { // NOLINT(google-explicit-constructor)
         store(MOXVALUE_INTEGER, number);
     }
 
+    /// A real.
     MoxValue(float number) { // NOLINT(google-explicit-constructor)
         store(MOXVALUE_REAL, number);
     }
@@ -76,17 +84,22 @@ public:
     MoxValue(double number) // NOLINT(google-explicit-constructor)
         : MoxValue(static_cast<float>(number)) {}
 
+    /// A copy of the map.
     MoxValue(const MoxNamedValueMap& map); // NOLINT(google-explicit-constructor)
 
+    /// A deep copy, key included.
     MoxValue(const MoxValue& other) { copyFrom(other); }
 
+    /// Takes the content over; what is left is null.
     MoxValue(MoxValue&& other) noexcept { takeFrom(other); }
 
     ~MoxValue() { drop(); }
 
     // `other` may live in a map that this value owns, so it is read before anything is dropped.
+    /// Copies deeply, key included.
     MoxValue& operator=(const MoxValue& other) { return *this = MoxValue(other); }
 
+    /// Takes the content over.
     MoxValue& operator=(MoxValue&& other) noexcept {
         MoxValue taken(std::move(other));
         drop();
@@ -107,13 +120,16 @@ public:
     /// True when type and content agree; the key plays no part, and a NaN differs from everything.
     bool operator==(const MoxValue& other) const;
 
+    /// False when both are the same.
     bool operator!=(const MoxValue& other) const { return !(*this == other); }
 
+    /// Returns: what it holds.
     MoxValueType getType() const { return static_cast<MoxValueType>(type); }
 
     /// Returns: the name under which the value stood, 0 for a value that stands nowhere.
     MoxName getKey() const { return MoxName::fromNumber(key); }
 
+    /// Sets the name under which the value stands.
     void setKey(MoxName name) { key = name.number; }
 
     /// Returns: the text of the value: a name gives its text, a real the shortest decimal that

@@ -5,6 +5,7 @@
 
 namespace MoxCommonNS {
 
+/// Names in XML documents.
 class DRAWMERE_API MoxXmlUtil {
 public:
     /// Returns: `local` itself with a prefix of 0, otherwise the name "prefix:local".

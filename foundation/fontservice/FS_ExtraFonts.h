@@ -26,7 +26,7 @@ struct FS_ExtraFont {
     /// Several fonts with one name are a family, of which weight, slant and width choose.
     std::vector<UnicodeString> names;
     int weight = 0; ///< 1 to 1000 as CSS counts; any other number: as the file says
-    FSSLANT slant = FSSLANT_UNSTATED;
+    FSSLANT slant = FSSLANT_UNSTATED; ///< of the face
     int widthClass =
         0; ///< 1 ultra-condensed to 9 ultra-expanded; any other number: as the file says
     int faceIndex = 0; ///< which face of a collection, 0 in a file of one face
@@ -47,7 +47,9 @@ struct FS_ExtraFont {
 class DRAWMERE_API FS_ExtraFonts {
 public:
     FS_ExtraFonts();
+    /// A copy.
     FS_ExtraFonts(const FS_ExtraFonts& other);
+    /// Copies everything.
     FS_ExtraFonts& operator=(const FS_ExtraFonts& other);
     ~FS_ExtraFonts();
 
@@ -63,7 +65,7 @@ public:
     /// Returns: the count of fonts added.
     int count() const;
 
-    std::unique_ptr<FS_ExtraFontList> fonts; // owned; never null
+    std::unique_ptr<FS_ExtraFontList> fonts; ///< owned; never null
 };
 
 } // namespace MoxFontService_NS

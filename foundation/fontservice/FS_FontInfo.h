@@ -24,10 +24,12 @@ struct FS_FoundFace;
 /// several. Copies share the face.
 class DRAWMERE_API FS_FontInfo {
 public:
-    static constexpr unsigned short noGlyph = 65535;
+    static constexpr unsigned short noGlyph = 65535; ///< stands for no glyph
 
     FS_FontInfo();
+    /// A copy.
     FS_FontInfo(const FS_FontInfo& other);
+    /// Copies everything.
     FS_FontInfo& operator=(const FS_FontInfo& other);
     ~FS_FontInfo();
 

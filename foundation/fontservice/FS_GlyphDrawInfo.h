@@ -28,9 +28,9 @@ struct FS_GlyphPolygon {
 /// One glyph.
 /// Units: font units.
 struct FS_GlyphDrawInfo {
-    int horizontalAdvance = 0;
-    int verticalAdvance = 0; ///< downwards; the em when the font says nothing
-    std::vector<FS_GlyphPolygon> polygons;
+    int horizontalAdvance = 0;             ///< in font units
+    int verticalAdvance = 0;               ///< downwards; the em when the font says nothing
+    std::vector<FS_GlyphPolygon> polygons; ///< the closed contours
 };
 
 } // namespace MoxFontService_NS

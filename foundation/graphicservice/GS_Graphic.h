@@ -39,8 +39,8 @@ public:
     /// Returns: the limit, 256 times 1024 times 1024 unless it was set.
     static std::int64_t getPixelLimit();
 
-    GS_RasterImage* raster = nullptr; // owned
-    bool isLoaded = false;
+    GS_RasterImage* raster = nullptr; ///< owned
+    bool isLoaded = false;            ///< whether the source could be decoded
 };
 
 } // namespace MoxGraphicService_NS

@@ -61,14 +61,14 @@ public:
     /// Returns: the first reason for which reading or writing failed.
     GS_Failure getFailure() const;
 
-    int columns = 0;
-    int rows = 0;
-    int targetColumns = 0; ///< 0 while no downsampling is set
-    int targetRows = 0;
-    GSMP_SAMPLINGTYPE samplingType = SAMPLINGTYPE_AVERAGE;
-    double xResolution = 0.0; ///< in pixels an inch, 0 for none
-    double yResolution = 0.0;
-    GS_Failure failure = FAILURE_NONE;
+    int columns = 0;                                       ///< in pixels, as shown
+    int rows = 0;                                          ///< in pixels, as shown
+    int targetColumns = 0;                                 ///< 0 while no downsampling is set
+    int targetRows = 0;                                    ///< likewise
+    GSMP_SAMPLINGTYPE samplingType = SAMPLINGTYPE_AVERAGE; ///< of the downsampling
+    double xResolution = 0.0;                              ///< in pixels an inch, 0 for none
+    double yResolution = 0.0;                              ///< likewise
+    GS_Failure failure = FAILURE_NONE;                     ///< the first, as `getFailure` gives it
 
 protected:
     /// Shape: the size in pixels as shown.

@@ -39,8 +39,10 @@ public:
     /// The same name among all names; `unknown` is no name.
     constexpr operator MoxCommonNS::MoxName() const; // NOLINT(google-explicit-constructor)
 
+    /// True when both are the same.
     constexpr bool operator==(const SVGName&) const = default;
 
+    /// Returns: the number, `unknown` for no name.
     constexpr Number getNumber() const { return number; }
 
 private:
@@ -49,10 +51,11 @@ private:
 
 /// A name of SVG 1.1 whose text is one of the well-known names, which have numbers of their own.
 struct SVGNameWithFixedNumber {
-    SVGName::Number number;
-    MoxCommonNS::MoxNameEnum shared;
+    SVGName::Number number;          ///< in the list of SVG 1.1
+    MoxCommonNS::MoxNameEnum shared; ///< among all names
 };
 
+/// All of them.
 inline constexpr SVGNameWithFixedNumber svgNamesWithFixedNumber[] = {
     {SVGName::alphabetic, MoxCommonNS::MOXNAME_ALPHABETIC},
     {SVGName::id, MoxCommonNS::MOXNAME_ID},
@@ -77,7 +80,7 @@ constexpr SVGNameNumbers makeSvgNameNumbers() {
     return numbers;
 }
 
-inline constexpr SVGNameNumbers svgNameNumbers = makeSvgNameNumbers();
+inline constexpr SVGNameNumbers svgNameNumbers = makeSvgNameNumbers(); ///< made once
 
 constexpr SVGName::SVGName(MoxCommonNS::MoxName shared) {
     // A number below the first free one wraps round to one that is far too large.

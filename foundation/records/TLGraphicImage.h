@@ -28,6 +28,7 @@ public:
     UnicodeString getOrgFileName() const;
 
 protected:
+    /// An image with this name, or without one.
     explicit TLGraphicImage(const UnicodeString& fileName = UnicodeString());
 
 private:
