@@ -64,5 +64,17 @@ TEST_F(LinkWriter, ALinkOutOfTheDocumentIsTakenOver) {
                 HasSubstr("<a xlink:href=\"https://pdfa.org\">"));
 }
 
+TEST_F(LinkWriter, ALinkToAScriptIsNone) {
+    conversion.directory.write("a.html", "<html><body><p><a href='javascript:alert(1)'>1</a> "
+                                         "<a href='JavaScript:alert(2)'>2</a> "
+                                         "<a href='MAILTO:a@example.com'>3</a> "
+                                         "<a href='tel:0123'>4</a></p></body></html>");
+    EXPECT_EQ(conversion.run({"a.html", "-o", "a.svg"}).status, 0);
+    const std::string page = conversion.directory.read("a.svg");
+    EXPECT_THAT(page, Not(HasSubstr("cript:alert")));
+    EXPECT_THAT(page, HasSubstr("<a xlink:href=\"MAILTO:a@example.com\">"));
+    EXPECT_THAT(page, HasSubstr("<a xlink:href=\"tel:0123\">"));
+}
+
 } // namespace
 } // namespace DrawmereTest

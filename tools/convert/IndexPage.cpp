@@ -1,6 +1,7 @@
 #include "tools/convert/IndexPage.h"
 
 #include "tools/convert/IndexTemplate.h"
+#include "tools/convert/LinkReader.h"
 
 #include <algorithm>
 #include <array>
@@ -39,16 +40,6 @@ std::string toText(float number) {
 
 std::string toPercent(float part, float whole) {
     return toText(whole > 0 ? 100 * part / whole : 0) + "%";
-}
-
-/// Returns: whether a reader may be led there: a relative path, or a scheme of a place.
-bool isPlace(std::string_view uri) {
-    const std::size_t colon = uri.find(':');
-    if (colon == std::string_view::npos || uri.substr(0, colon).find('/') != std::string::npos) {
-        return true;
-    }
-    constexpr std::array<std::string_view, 5> schemes = {"http", "https", "mailto", "ftp", "file"};
-    return std::ranges::find(schemes, uri.substr(0, colon)) != schemes.end();
 }
 
 /// Writes the page, part by part.
@@ -189,7 +180,7 @@ private:
         const std::string file = hash == 0 ? entry.file : target.substr(0, hash);
         const auto found = numbers.find(file);
         if (found == numbers.end()) {
-            return isPlace(target) ? target : std::string();
+            return leadsToPlace(target) ? target : std::string();
         }
         const std::string page = "#p" + std::to_string(found->second);
         return hash == std::string::npos ? page : page + "." + target.substr(hash + 1);

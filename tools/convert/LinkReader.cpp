@@ -3,6 +3,8 @@
 #include "tools/convert/FitzCall.h"
 
 #include <algorithm>
+#include <array>
+#include <cctype>
 #include <cmath>
 
 namespace DrawmereConvert {
@@ -72,7 +74,7 @@ PageLink toLink(fz_context* ctx, fz_document* document, const fz_link& link) {
         return result;
     }
     if (fz_is_external_link(ctx, uri)) {
-        result.uri = uri;
+        result.uri = leadsToPlace(uri) ? uri : "";
         return result;
     }
     fz_link_dest target{};
@@ -104,6 +106,20 @@ int findPage(fz_context* ctx, fz_document* document, const fz_outline& entry) {
 }
 
 } // namespace
+
+bool leadsToPlace(std::string_view uri) {
+    const std::size_t colon = uri.find(':');
+    if (colon == std::string_view::npos || uri.substr(0, colon).find('/') != std::string::npos) {
+        return true;
+    }
+    constexpr std::array<std::string_view, 6> schemes = {"http", "https", "mailto",
+                                                         "ftp",  "file",  "tel"};
+    std::string scheme(uri.substr(0, colon));
+    std::ranges::transform(scheme, scheme.begin(), [](unsigned char sign) {
+        return static_cast<char>(std::tolower(sign));
+    });
+    return std::ranges::find(schemes, scheme) != schemes.end();
+}
 
 std::vector<PageLink> readLinks(fz_context* ctx, fz_document* document, fz_page* page) {
     fz_link* first = nullptr;

@@ -7,6 +7,7 @@
 #include <mupdf/fitz.h>
 
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace DrawmereConvert {
@@ -18,6 +19,10 @@ struct PageLink {
     int page = -1;               ///< from 0, to which it leads otherwise
     LinkDestination destination; ///< the place there, with an empty id for the page as a whole
 };
+
+/// Returns: whether a reader may be led to `uri`: a relative path, or a scheme of a place. A script
+/// is none; a browser that shows the page would run it.
+bool leadsToPlace(std::string_view uri);
 
 /// Returns: the links of `page` that lead somewhere; none when they can't be read.
 std::vector<PageLink> readLinks(fz_context* ctx, fz_document* document, fz_page* page);
