@@ -1,45 +1,50 @@
-/// Random drawing calls: any order, any argument, the same for the same seed.
+/// Random drawing calls: any order, any argument, the same for the same choices.
 #pragma once
 
 #include "Drawmere.h"
+#include "tests/support/Choices.h"
 #include "tests/support/TempDir.h"
 
 #include <cstddef>
 #include <iosfwd>
-#include <random>
+#include <string_view>
 #include <type_traits>
+#include <vector>
 
 namespace DrawmereTest {
 
 using namespace DrawmereNS;
 
 /// Makes calls with arguments that no careful caller would choose, and catches what they throw.
-class RandomCalls {
+class RandomCalls : public Choices {
 public:
-    explicit RandomCalls(unsigned seed) : numbers(seed) {}
+    /// What arguments are made of.
+    enum Temper {
+        WILD, ///< any number and any text
+        TAME, ///< numbers of the size of a page, listed enumerators, words and ids that were made
+    };
 
-    /// Sets the options of a document to something, also to what means nothing.
+    explicit RandomCalls(unsigned seed, Temper kind = WILD) : Choices(seed), temper(kind) {}
+
+    explicit RandomCalls(std::string_view text, Temper kind = WILD)
+        : Choices(text), temper(kind) {}
+
+    /// Sets the options of a document to something, also to what means nothing. It leaves alone
+    /// where the output goes and whether it is compressed.
     void configure(SVGConfig& config);
 
-    /// Makes `count` calls; then finishes the run, which writes its first document to `stream`.
+    /// Makes up to `count` calls, fewer when the bytes are used up; then finishes the run. Its
+    /// documents go to `stream` with `SVGConfig::streamOutput`, to the page URI otherwise.
     void draw(Drawmere& page, std::ostream& stream, int count);
 
-    /// Returns: a number from 0 to `limit` - 1.
-    unsigned below(unsigned limit) { return static_cast<unsigned>(numbers() % limit); }
-
-    /// Returns: a row of the table.
-    template <typename T, std::size_t count> T pick(const T (&table)[count]) {
-        return table[below(count)];
-    }
-
-    bool flag() { return below(2) == 0; }
-
     /// Returns: an argument of this type. Half of the integers and enumerators are small numbers,
-    /// the others are anything.
+    /// the others are anything, or small too where they are tame.
     template <typename T> T make() {
         static_assert(std::is_enum_v<T> || std::is_integral_v<T>, "other types have their own");
-        return static_cast<T>(flag() ? static_cast<int>(below(7)) - 2
-                                     : static_cast<int>(numbers()));
+        if (temper == TAME) {
+            return static_cast<T>(below(3));
+        }
+        return static_cast<T>(flag() ? static_cast<int>(below(7)) - 2 : static_cast<int>(number()));
     }
 
     /// Returns: up to 7 of them.
@@ -51,9 +56,10 @@ public:
         return list;
     }
 
-private:
-    std::mt19937 numbers;
-    TempDir directory;
+    const Temper temper;
+    const TempDir directory;              ///< where images are copied to
+    std::vector<UnicodeString> ids;       ///< what the calls returned, in order
+    std::vector<UnicodeString> madeTexts; ///< what was made as an argument, in order
 };
 
 template <> bool RandomCalls::make<bool>();

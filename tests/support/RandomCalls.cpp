@@ -1,16 +1,28 @@
-#include "tests/frontend/RandomCalls.h"
+#include "tests/support/RandomCalls.h"
 
 #include "foundation/records/TLMemoryImage.h"
 #include "foundation/records/TLStringWithGlyphInfo.h"
 #include "tests/fonts/EmbeddedFont.h"
 #include "tests/support/TinyImages.h"
 
+#include <tuple>
+
 namespace DrawmereTest {
 namespace {
 
+// Between braces arguments are made in order; between parentheses compilers differ.
 template <typename Result, typename... Args>
 void callMember(RandomCalls& any, Drawmere& page, Result (Drawmere::*member)(Args...)) {
-    static_cast<void>((page.*member)(any.make<std::decay_t<Args>>()...));
+    std::tuple<std::decay_t<Args>...> arguments{any.make<std::decay_t<Args>>()...};
+    std::apply(
+        [&](auto&... values) {
+            if constexpr (std::is_same_v<Result, UnicodeString>) {
+                any.ids.push_back((page.*member)(values...));
+            } else {
+                static_cast<void>((page.*member)(values...));
+            }
+        },
+        arguments);
 }
 
 /// Calls the member with arguments made for it.
@@ -45,23 +57,94 @@ void drawFile(RandomCalls& any, Drawmere& page) {
     constexpr TLGraphicType types[] = {TalGraphic::TLGRAPHICTYPE_OTHER,
                                        TalGraphic::TLGRAPHICTYPE_PNG};
     const std::string& file = files[any.below(5)];
-    const bool isDamaged = any.below(8) == 0;
+    const bool isDamaged = any.below(8) == 7;
     const std::string bytes = file.substr(0, isDamaged ? file.size() / 2 : file.size());
-    const bool isOdd = any.below(4) == 0;
+    const bool isOdd = any.temper == RandomCalls::WILD && any.below(4) == 3;
     const auto type = isOdd ? any.make<TLGraphicType>() : any.pick(types);
-    AnyImage image(type, bytes, isOdd ? any.make<UnicodeString>() : UnicodeString(any.pick(names)));
-    const auto length = [&any] { return any.make<MoxLength>(); };
-    page.drawImage(&image, type, length(), length(), length(), length());
+    const auto name = isOdd ? any.make<UnicodeString>() : UnicodeString(any.pick(names));
+    const auto size = any.make<MoxPointT<MoxLength>>();
+    const auto place = any.make<MoxPointT<MoxLength>>();
+    AnyImage image(type, bytes, name);
+    page.drawImage(&image, type, size.x, size.y, place.x, place.y);
 }
 
 /// Sets a font that there is.
 void setTestFont(RandomCalls& any, Drawmere& page) {
     constexpr const char16_t* faces[] = {uprightFace, hanFace, arabicFace, latinFace};
     SVGFont font = any.make<SVGFont>();
-    font.setFontAttribute(any.pick(faces), any.make<MoxLength>(), FONTWEIGHT_NORMAL, FSTYLE_NORMAL,
-                          any.make<UnicodeString>(), any.flag());
-    font.setEmbedAttribute(any.below(4) != 0, any.flag());
+    const auto size = any.make<MoxLength>();
+    const auto variant = any.make<UnicodeString>();
+    const bool isVertical = any.flag();
+    font.setFontAttribute(any.pick(faces), size, FONTWEIGHT_NORMAL, FSTYLE_NORMAL, variant,
+                          isVertical);
+    font.embedFont = any.below(4) != 3;
     page.setFont(&font, &testFonts());
+}
+
+void setSystemFont(RandomCalls& any, Drawmere& page) {
+    SVGFont font = any.make<SVGFont>();
+    page.setFont(any.flag() ? &font : nullptr, nullptr);
+}
+
+void setDashLine(RandomCalls& any, Drawmere& page) {
+    const auto dashes = any.makeList<MoxLength>();
+    const auto offset = any.make<MoxLength>();
+    if (any.flag()) {
+        page.setDashLine(dashes.data(), static_cast<int>(dashes.size()), offset);
+    } else {
+        page.setDashLine(nullptr, any.make<int>(), offset);
+    }
+}
+
+void drawPolyline(RandomCalls& any, Drawmere& page) {
+    auto points = any.makeList<float>();
+    page.drawPolyline(points.data(), static_cast<int>(points.size()), any.make<PAINTMODE>());
+}
+
+void drawPolygon(RandomCalls& any, Drawmere& page) {
+    if (any.flag()) {
+        auto points = any.makeList<float>();
+        page.drawPolygon(points.data(), static_cast<int>(points.size()), any.make<PAINTMODE>());
+    } else {
+        page.drawPolygon(nullptr, static_cast<int>(any.number()), PAINTMODE_FILL);
+    }
+}
+
+void drawRun(RandomCalls& any, Drawmere& page) {
+    const auto text = any.make<UnicodeString>();
+    const auto x = any.makeList<MoxLength>();
+    const auto y = any.makeList<MoxLength>();
+    const auto rotate = any.makeList<float>();
+    const auto mode = any.make<PAINTMODE>();
+    const bool hasGlyphs = any.flag();
+    const bool isWhole = any.flag();
+    std::vector<TalFont::TLGlyphEntry> entries;
+    for (unsigned count = hasGlyphs ? any.below(4) : 0; count > 0; --count) {
+        entries.push_back({any.make<std::int16_t>(), any.make<std::uint16_t>()});
+    }
+    TalFont::TLStringWithGlyphInfo glyphs(entries);
+    page.drawText(text, x, y, rotate, mode, hasGlyphs ? &glyphs : nullptr, isWhole, any.flag());
+}
+
+void drawText(RandomCalls& any, Drawmere& page) {
+    const auto text = any.make<UnicodeString>();
+    const auto place = any.make<MoxPointT<MoxLength>>();
+    const auto mode = any.make<PAINTMODE>();
+    const bool isWhole = any.flag();
+    page.drawText(text, place.x, place.y, mode, nullptr, isWhole, any.flag());
+}
+
+void drawNoImage(RandomCalls& any, Drawmere& page) {
+    const auto length = any.make<MoxLength>();
+    page.drawImage(nullptr, any.make<TLGraphicType>(), length, length, length, length);
+}
+
+void openDocument(Drawmere& page, std::ostream& stream) {
+    if (page.config->streamOutput) {
+        page.initRootSvg(&stream);
+    } else {
+        page.initRootSvg(page.pageUri->getText());
+    }
 }
 
 using Length = MoxLength;
@@ -129,39 +212,13 @@ constexpr void (*calls[])(RandomCalls& any, Drawmere& page) = {
     call<&Drawmere::endPage>,
     call<&Drawmere::hasError>,
     call<&Drawmere::popError>,
-    [](RandomCalls& any, Drawmere& page) {
-        SVGFont font = any.make<SVGFont>();
-        page.setFont(any.flag() ? &font : nullptr, nullptr);
-    },
-    [](RandomCalls& any, Drawmere& page) {
-        const auto dashes = any.makeList<MoxLength>();
-        const bool isNull = any.flag();
-        page.setDashLine(isNull ? nullptr : dashes.data(),
-                         isNull ? any.make<int>() : static_cast<int>(dashes.size()),
-                         any.make<MoxLength>());
-    },
-    [](RandomCalls& any, Drawmere& page) {
-        auto points = any.makeList<float>();
-        page.drawPolyline(points.data(), static_cast<int>(points.size()), any.make<PAINTMODE>());
-    },
-    [](RandomCalls& any, Drawmere& page) {
-        page.drawPolygon(nullptr, any.make<int>(), any.make<PAINTMODE>());
-    },
-    [](RandomCalls& any, Drawmere& page) {
-        TalFont::TLStringWithGlyphInfo glyphs(std::vector<TalFont::TLGlyphEntry>{
-            {any.make<std::int16_t>(), any.make<std::uint16_t>()}});
-        page.drawText(any.make<UnicodeString>(), any.makeList<MoxLength>(),
-                      any.makeList<MoxLength>(), any.makeList<float>(), any.make<PAINTMODE>(),
-                      any.flag() ? &glyphs : nullptr, any.flag(), any.flag());
-    },
-    [](RandomCalls& any, Drawmere& page) {
-        page.drawText(any.make<UnicodeString>(), any.make<MoxLength>(), any.make<MoxLength>(),
-                      any.make<PAINTMODE>(), nullptr, any.flag(), any.flag());
-    },
-    [](RandomCalls& any, Drawmere& page) {
-        page.drawImage(nullptr, any.make<TLGraphicType>(), any.make<MoxLength>(),
-                       any.make<MoxLength>(), any.make<MoxLength>(), any.make<MoxLength>());
-    },
+    setSystemFont,
+    setDashLine,
+    drawPolyline,
+    drawPolygon,
+    drawRun,
+    drawText,
+    drawNoImage,
     drawFile,
     setTestFont,
 };
@@ -169,13 +226,13 @@ constexpr void (*calls[])(RandomCalls& any, Drawmere& page) = {
 } // namespace
 
 void RandomCalls::draw(Drawmere& page, std::ostream& stream, int count) {
-    constexpr unsigned callsOfADocument = 300;
-    for (; count > 0; --count) {
+    constexpr unsigned callsOfADocument = 240;
+    for (; count > 0 && !isUsedUp(); --count) {
         try {
-            if (below(callsOfADocument) == 0) {
+            if (!page.impl) {
+                openDocument(page, stream);
+            } else if (below(callsOfADocument) == callsOfADocument - 1) {
                 page.finishRootSvg();
-            } else if (!page.impl) {
-                page.initRootSvg(&stream);
             } else {
                 pick(calls)(*this, page);
             }

@@ -1,7 +1,7 @@
 // The arguments of random calls, and the options of their documents.
 #include "foundation/common/MoxNameTable.h"
 #include "foundation/common/MoxNamedValueMap.h"
-#include "tests/frontend/RandomCalls.h"
+#include "tests/support/RandomCalls.h"
 
 #include <bit>
 #include <limits>
@@ -29,6 +29,15 @@ constexpr const char16_t* oddTexts[] = {
     u"]]><&\"'>", u"\t\n\r ", u"\x0b]", u"\xd800\xb", u"\xdc00\xd83d\xde00\xfe", u"\xffff\xfffe",
 };
 
+constexpr const char16_t* tameTexts[] = {
+    u"none", u"#a", u"a", u"A line of text", u"#Mox-SVG-page-1", u"http://www.example.com/", u"b1",
+};
+
+constexpr SVGConfig::SVGTYPE profiles[] = {
+    SVGConfig::SVGTYPE_FULL,    SVGConfig::SVGTYPE_BASIC, SVGConfig::SVGTYPE_TINY,
+    SVGConfig::SVGTYPE_PLAZMIC, SVGConfig::SVGTYPE_WISP,
+};
+
 constexpr const char16_t* saveOptions[] = {
     u"", u"indent", u"decimals=2", u"indent,decimals=0", u",,decimals=99999999999,=",
 };
@@ -45,8 +54,8 @@ constexpr MoxCommonNS::MoxNameEnum linkKeys[] = {
 
 void RandomCalls::configure(SVGConfig& config) {
     config.saveOption = pick(saveOptions);
-    config.svgType = make<SVGConfig::SVGTYPE>();
-    config.svgVersion = make<UnicodeString>();
+    config.svgType = temper == TAME ? pick(profiles) : make<SVGConfig::SVGTYPE>();
+    config.svgVersion = temper == TAME ? u"1.1" : make<UnicodeString>();
     config.wispMode = flag();
     config.colorFlag = flag();
     config.imageBaseUri = make<UnicodeString>();
@@ -64,20 +73,26 @@ void RandomCalls::configure(SVGConfig& config) {
 template <> bool RandomCalls::make<bool>() { return flag(); }
 
 template <> float RandomCalls::make<float>() {
-    const float odd = pick(oddReals);
-    const float usual = static_cast<float>(below(2000)) / 10.0F - 50.0F;
-    const float any = std::bit_cast<float>(static_cast<std::uint32_t>(numbers()));
-    return flag() ? usual : flag() ? odd : any;
+    if (temper == TAME || flag()) {
+        return static_cast<float>(below(2000)) / 10.0F - 50.0F;
+    }
+    return flag() ? pick(oddReals) : std::bit_cast<float>(number());
 }
 
 template <> UnicodeString RandomCalls::make<UnicodeString>() {
-    UnicodeString text = pick(oddTexts);
-    for (unsigned more = flag() ? below(12) : 0; more > 0; --more) {
-        text.append(static_cast<char16_t>(below(flag() ? 0x80 : 0x10000)));
+    if (!ids.empty() && below(4) == 0) {
+        return ids[below(static_cast<unsigned>(ids.size()))];
     }
-    if (below(50) == 0) {
-        text.setToBogus();
+    UnicodeString text = temper == TAME ? pick(tameTexts) : pick(oddTexts);
+    if (temper == WILD) {
+        for (unsigned more = flag() ? 0 : below(12); more > 0; --more) {
+            text.append(static_cast<char16_t>(below(flag() ? 0x80 : 0x10000)));
+        }
+        if (below(50) == 49) {
+            text.setToBogus();
+        }
     }
+    madeTexts.push_back(text);
     return text;
 }
 
@@ -94,14 +109,19 @@ template <> MoxRectT<MoxLength> RandomCalls::make<MoxRectT<MoxLength>>() {
 template <> MoxColor RandomCalls::make<MoxColor>() { return make<unsigned>(); }
 
 template <> MoxName RandomCalls::make<MoxName>() {
-    return flag() ? MoxName::fromNumber(make<unsigned>()) : MoxName(make<UnicodeString>());
+    const bool isNumber = temper == WILD && flag();
+    return isNumber ? MoxName::fromNumber(make<unsigned>()) : MoxName(make<UnicodeString>());
 }
+
+// Compilers differ in the order in which they make the arguments of a call. What is made between
+// braces, or in a line of its own, is made in the order in which it is written.
 
 template <> MoxValue RandomCalls::make<MoxValue>() {
     MoxCommonNS::MoxNamedValueMap map;
-    map.setNamedItem(pick(linkKeys), make<UnicodeString>());
-    map.setNamedItem(pick(linkKeys), make<MoxName>());
-    map.setNamedItem(pick(linkKeys), make<int>());
+    const auto add = [&](const auto& value) { map.setNamedItem(pick(linkKeys), value); };
+    add(make<UnicodeString>());
+    add(make<MoxName>());
+    add(make<int>());
     MoxCommonNS::MoxNamedValueMap outer;
     outer.setNamedItem(pick(linkKeys), map);
     return flag() ? MoxValue(outer) : MoxValue(map);
@@ -113,10 +133,16 @@ template <> SVGMatrix RandomCalls::make<SVGMatrix>() {
 }
 
 template <> SVGFont RandomCalls::make<SVGFont>() {
+    const UnicodeString name = make<UnicodeString>();
+    const UnicodeString variant = make<UnicodeString>();
+    const auto size = make<MoxLength>();
+    const auto weight = make<FONTWEIGHT>();
+    const auto style = make<FSTYLE>();
+    const bool isVertical = flag();
+    const bool isEmbedded = flag();
     SVGFont font;
-    font.setFontAttribute(make<UnicodeString>(), make<MoxLength>(), make<FONTWEIGHT>(),
-                          make<FSTYLE>(), make<UnicodeString>(), flag());
-    font.setEmbedAttribute(flag(), flag());
+    font.setFontAttribute(name, size, weight, style, variant, isVertical);
+    font.setEmbedAttribute(isEmbedded, flag());
     font.setFontStretch(make<FONTSTRECH>());
     return font;
 }

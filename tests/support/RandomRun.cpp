@@ -1,0 +1,45 @@
+#include "tests/support/RandomRun.h"
+
+#include "tests/support/Gunzip.h"
+
+#include <filesystem>
+
+namespace DrawmereTest {
+
+RandomRun::RandomRun(RandomCalls& choices)
+    : calls(choices), uri(output.uri("page.svg"), choices.make<UnicodeString>()) {
+    calls.configure(config);
+    config.streamOutput = calls.flag();
+    config.singleFile = calls.flag();
+    config.gzip = calls.flag();
+    config.keepPageNumber = calls.flag();
+}
+
+std::vector<std::string> RandomRun::draw(int count) {
+    // What can't be written is thrown, and there is nothing to look at.
+    try {
+        calls.draw(drawmere, stream, count);
+    } catch (const MoxError&) {
+        stream.str({});
+    }
+    std::vector<std::string> documents = listDocuments();
+    if (config.gzip) {
+        for (std::string& document : documents) {
+            document = gunzip(document);
+        }
+    }
+    return documents;
+}
+
+std::vector<std::string> RandomRun::listDocuments() const {
+    std::vector<std::string> documents;
+    if (!stream.str().empty()) {
+        documents.push_back(stream.str());
+    }
+    for (const auto& file : std::filesystem::directory_iterator(output.path())) {
+        documents.push_back(output.read(file.path().filename().string()));
+    }
+    return documents;
+}
+
+} // namespace DrawmereTest
