@@ -36,11 +36,11 @@ public:
         return table[below(count)];
     }
 
-    /// Returns: the bytes that no choice has taken yet, and takes them all; none with a seed.
-    std::string_view takeRest() {
-        const std::string_view rest = bytes;
-        bytes = {};
-        return rest;
+    /// Returns: up to `most` of the bytes that no choice has taken yet; none with a seed.
+    std::string_view takeBytes(std::size_t most) {
+        const std::string_view taken = bytes.substr(0, most);
+        bytes.remove_prefix(taken.size());
+        return taken;
     }
 
 private:

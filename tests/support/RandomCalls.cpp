@@ -1,9 +1,11 @@
 #include "tests/support/RandomCalls.h"
 
+#include "draw/DrawmereImpl.h"
 #include "foundation/records/TLMemoryImage.h"
 #include "foundation/records/TLStringWithGlyphInfo.h"
 #include "tests/fonts/EmbeddedFont.h"
 #include "tests/support/TinyImages.h"
+#include "tree/SVGTreeManager.h"
 
 #include <tuple>
 
@@ -223,18 +225,45 @@ constexpr void (*calls[])(RandomCalls& any, Drawmere& page) = {
     setTestFont,
 };
 
+/// The id of the definition that is written now, empty when none is.
+UnicodeString getOpenDefinition(const DrawmereImpl& impl) {
+    const SVGElement* node = impl.treeManager->getCurrentNode();
+    const MoxCommonNS::MoxNode* top = node;
+    while (top && top->parentLink()) {
+        top = top->parentLink();
+    }
+    const bool isInDocument = top == impl.treeManager->document.get();
+    return isInDocument ? node->getAttribute(MoxName(u"id")).toString() : UnicodeString();
+}
+
 } // namespace
+
+void RandomCalls::makeCall(Drawmere& page) {
+    const std::size_t idCount = ids.size();
+    const UnicodeString clip = page.impl->clipPathId;
+    pick(calls)(*this, page);
+    if (!page.impl) {
+        return;
+    }
+    if (page.impl->clipPathId != clip) {
+        ids.push_back(page.impl->clipPathId);
+    }
+    if (ids.size() > idCount && getOpenDefinition(*page.impl) != ids.back()) {
+        lostIds.push_back(ids.back());
+    }
+}
 
 void RandomCalls::draw(Drawmere& page, std::ostream& stream, int count) {
     constexpr unsigned callsOfADocument = 240;
     for (; count > 0 && !isUsedUp(); --count) {
         try {
             if (!page.impl) {
+                ids.clear();
                 openDocument(page, stream);
             } else if (below(callsOfADocument) == callsOfADocument - 1) {
                 page.finishRootSvg();
             } else {
-                pick(calls)(*this, page);
+                makeCall(page);
             }
         } catch (const MoxError&) { // NOLINT(bugprone-empty-catch): calls in no order throw
         }

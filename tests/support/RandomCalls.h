@@ -26,8 +26,7 @@ public:
 
     explicit RandomCalls(unsigned seed, Temper kind = WILD) : Choices(seed), temper(kind) {}
 
-    explicit RandomCalls(std::string_view text, Temper kind = WILD)
-        : Choices(text), temper(kind) {}
+    explicit RandomCalls(std::string_view text, Temper kind = WILD) : Choices(text), temper(kind) {}
 
     /// Sets the options of a document to something, also to what means nothing. It leaves alone
     /// where the output goes and whether it is compressed.
@@ -58,8 +57,12 @@ public:
 
     const Temper temper;
     const TempDir directory;              ///< where images are copied to
-    std::vector<UnicodeString> ids;       ///< what the calls returned, in order
+    std::vector<UnicodeString> ids;       ///< of definitions in the open document, in order
+    std::vector<UnicodeString> lostIds;   ///< of those whose start call wrote no definition
     std::vector<UnicodeString> madeTexts; ///< what was made as an argument, in order
+
+private:
+    void makeCall(Drawmere& page);
 };
 
 template <> bool RandomCalls::make<bool>();

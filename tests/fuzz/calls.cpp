@@ -1,0 +1,43 @@
+// Bytes to drawing calls, in every profile and every form of output: what is written is a
+// well-formed document, all that the library itself refers to is there, and the tree says the same
+// as its text.
+#include "tests/fuzz/References.h"
+#include "tests/fuzz/Require.h"
+#include "tests/fuzz/TreeReading.h"
+#include "tests/support/RandomRun.h"
+
+using namespace DrawmereTest;
+
+namespace {
+
+constexpr int callCount = 2000;
+
+void checkDocument(const std::string& document, const RandomCalls& calls) {
+    const XmlReading reading = readXml(document);
+    require(reading.error.empty(), reading.error);
+    const std::string fault = References(reading).findFault(calls.madeTexts, calls.lostIds);
+    require(fault.empty(), fault);
+}
+
+void checkTree(const MoxDocument& document) {
+    std::ostringstream stream;
+    document.save(u"", u"", stream, nullptr, u"", u"");
+    const XmlReading reading = readXml(stream.str());
+    require(reading.error.empty(), reading.error);
+    const std::string difference = findDifference(readTree(document), reading.events);
+    require(difference.empty(), difference);
+}
+
+} // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    RandomCalls calls(inputOf(data, size));
+    RandomRun run(calls);
+    for (const std::string& document : run.draw(callCount)) {
+        checkDocument(document, calls);
+    }
+    for (const auto& [page, document] : run.drawmere.documents) {
+        checkTree(*document);
+    }
+    return 0;
+}
