@@ -1,7 +1,9 @@
-// compare-pages [-d DIRECTORY] EXPECTED.png PAGE.png...: for each pair prints a line with the share
-// of pixels that differ visibly, in percent. Pictures are blurred by one pixel before, so that what
-// renderers make of an edge doesn't count. With -d, pictures of both beside each other and of the
-// difference go to the directory, named like the page.
+// compare-pages [-d DIRECTORY] [-a SCALE] EXPECTED.png PAGE.png...: for each pair prints a line
+// with the share of pixels that differ visibly, in percent. Pictures are blurred by one pixel
+// before, so that what renderers make of an edge doesn't count. With -d, pictures of both beside
+// each other and of the difference go to the directory, named like the page. With -a the expected
+// pictures are SCALE times as large as the pages, and each square of that many pixels becomes their
+// average.
 
 #include <algorithm>
 #include <array>
@@ -75,6 +77,38 @@ Pixels readPixels(const char* path) {
         std::transform(line, line + pixels.width, std::back_inserter(pixels.values), onWhite);
     }
     return pixels;
+}
+
+std::uint32_t average(const Pixels& pixels, int left, int top, int scale) {
+    std::array<int, channelCount> sum{};
+    for (int y = top; y < top + scale; ++y) {
+        for (int x = left; x < left + scale; ++x) {
+            const std::uint32_t pixel = pixels.at(x, y);
+            for (int i = 0; i < channelCount; ++i) {
+                sum.at(static_cast<std::size_t>(i)) += channel(pixel, i);
+            }
+        }
+    }
+    const int count = scale * scale;
+    const auto part = [&](int value) {
+        return static_cast<std::uint32_t>((value + count / 2) / count);
+    };
+    return part(sum[0]) | part(sum[1]) << 8U | part(sum[2]) << 16U;
+}
+
+Pixels shrink(Pixels pixels, int scale) {
+    if (scale == 1) {
+        return pixels;
+    }
+    Pixels result;
+    result.width = (pixels.width + scale / 2) / scale;
+    result.height = (pixels.height + scale / 2) / scale;
+    for (int y = 0; y < result.height; ++y) {
+        for (int x = 0; x < result.width; ++x) {
+            result.values.push_back(average(pixels, x * scale, y * scale, scale));
+        }
+    }
+    return result;
 }
 
 using Color = std::array<int, channelCount>;
@@ -159,26 +193,46 @@ void writeTriple(const Pixels& expected, const Pixels& page, const Comparison& r
     cairo_surface_write_to_png(image.get(), path.c_str());
 }
 
+struct Options {
+    std::string directory; ///< of pictures of the differences, if any
+    int scale = 1;         ///< of the expected pictures
+};
+
+/// Takes the options off of the front of `files`.
+Options takeOptions(std::vector<const char*>& files) {
+    Options options;
+    while (files.size() > 1 && files.front()[0] == '-') {
+        if (std::string(files.front()) == "-d") {
+            options.directory = files[1];
+        } else {
+            options.scale = std::max(1, std::atoi(files[1]));
+        }
+        files.erase(files.begin(), files.begin() + 2);
+    }
+    return options;
+}
+
+void compareFiles(const char* expectedPath, const char* pagePath, const Options& options) {
+    const Pixels expected = shrink(readPixels(expectedPath), options.scale);
+    const Pixels page = readPixels(pagePath);
+    const Comparison result = compare(expected, page);
+    std::printf("%.3f\n", result.percent());
+    if (!options.directory.empty()) {
+        const std::filesystem::path name = std::filesystem::path(pagePath).filename();
+        writeTriple(expected, page, result,
+                    (std::filesystem::path(options.directory) / name).string());
+    }
+}
+
 } // namespace
 
 int main(int argc, char** argv) {
     std::vector<const char*> files(argv + 1, argv + argc);
-    std::string directory;
-    if (files.size() > 1 && std::string(files.front()) == "-d") {
-        directory = files[1];
-        files.erase(files.begin(), files.begin() + 2);
-    }
+    const Options options = takeOptions(files);
     int status = 0;
     for (std::size_t i = 0; i + 1 < files.size(); i += 2) {
         try {
-            const Pixels expected = readPixels(files[i]);
-            const Pixels page = readPixels(files[i + 1]);
-            const Comparison result = compare(expected, page);
-            std::printf("%.3f\n", result.percent());
-            if (!directory.empty()) {
-                const std::filesystem::path name = std::filesystem::path(files[i + 1]).filename();
-                writeTriple(expected, page, result, (directory / name).string());
-            }
+            compareFiles(files[i], files[i + 1], options);
         } catch (const std::exception& error) {
             std::printf("100.000\n");
             std::fprintf(stderr, "compare-pages: %s\n", error.what());
