@@ -21,9 +21,9 @@ PageSource makeGroup(const std::string& content) {
 
 /// A page that draws `content` through the mask `mask`.
 PageSource makeMasked(const std::string& mask, const std::string& content,
-                      const std::string& kind = "Luminosity") {
+                      const std::string& kind = "Luminosity", const std::string& states = "") {
     return {"/G gs " + content,
-            "/ExtGState<</G<</SMask<</S/" + kind + "/G 5 0 R>>>>>>",
+            "/ExtGState<</G<</SMask<</S/" + kind + "/G 5 0 R>>>>" + states + ">>",
             {{form, mask}}};
 }
 
@@ -106,10 +106,54 @@ TEST(Layers, APatternWhoseCellsOverlapIsCounted) {
     EXPECT_EQ(page.report.approximations.at(DrawmereConvert::APPROXIMATION_PATTERN), 1);
 }
 
-TEST(Layers, BlendModesAreCounted) {
-    const DrawnPage page({"/G gs 10 10 50 50 re f", "/ExtGState<</G<</BM/Multiply>>>>"});
-    EXPECT_EQ(page.report.approximations.at(DrawmereConvert::APPROXIMATION_BLEND), 1);
+TEST(Layers, AMaskEndsWithWhatItMasks) {
+    const DrawnPage page(makeMasked("0.5 g 0 0 200 100 re f",
+                                    "10 10 50 50 re f /N gs 30 30 50 50 re f", "Luminosity",
+                                    "/N<</SMask/None>>"));
+    EXPECT_THAT(page.svg, HasSubstr("mask=\"url(#i0)\"><rect x=\"10\" y=\"40\" width=\"50\" "
+                                    "height=\"50\"/></g>"));
+    EXPECT_EQ(page.count("rect"), 3);
+}
+
+/// A page that fills `backdrop`, and over it a green square with a blend mode.
+PageSource makeBlended(const std::string& mode, const std::string& backdrop) {
+    return {backdrop + " /G gs 0 1 0 rg 10 10 50 50 re f", "/ExtGState<</G<</BM/" + mode + ">>>>"};
+}
+
+int countBlended(const DrawnPage& page) {
+    return page.report.approximations.at(DrawmereConvert::APPROXIMATION_MIXTURE);
+}
+
+TEST(Layers, AMixtureOfColoursIsAPicture) {
+    const DrawnPage page(makeBlended("Multiply", "1 0 0 rg 30 30 100 50 re f"));
+    EXPECT_EQ(page.count("image"), 1);
     EXPECT_EQ(page.count("rect"), 1);
+    EXPECT_EQ(countBlended(page), 1);
+    EXPECT_EQ(page.report.countApproximations(), 1);
+}
+
+TEST(Layers, ABlendModeWithoutEffectIsLeftOut) {
+    const DrawnPage page(makeBlended("Multiply", "0 0 1 rg 70 70 20 20 re f"));
+    EXPECT_EQ(page.count("image"), 0);
+    EXPECT_EQ(page.count("rect"), 2);
+    EXPECT_EQ(page.report.countApproximations(), 0);
+}
+
+TEST(Layers, WhatComesBehindAPictureIsDrawnAgain) {
+    PageSource source = makeBlended("Difference", "1 0 0 rg 30 30 100 50 re f");
+    source.content += " /N gs 0 0 1 rg 1 1 5 5 re f";
+    source.resources = "/ExtGState<</G<</BM/Difference>>/N<</BM/Normal>>>>";
+    EXPECT_EQ(DrawnPage(source).count("rect"), 2);
+}
+
+TEST(Layers, BlendModesInAPatternAreCounted) {
+    const DrawnPage page({"/Pattern cs /P scn 10 10 80 80 re f",
+                          "/Pattern<</P 5 0 R>>",
+                          {{"/PatternType 1/PaintType 1/TilingType 1/BBox[0 0 9 9]/XStep 9/YStep 9"
+                            "/Resources<</ExtGState<</G<</BM/Multiply>>>>>>",
+                            "/G gs 1 0 0 rg 0 0 5 5 re f"}}});
+    EXPECT_EQ(page.report.approximations.at(DrawmereConvert::APPROXIMATION_BLEND), 1);
+    EXPECT_EQ(page.count("image"), 0);
 }
 
 TEST(Layers, TextClipsWhatComesAfterIt) {

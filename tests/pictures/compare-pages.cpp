@@ -85,7 +85,7 @@ std::uint32_t average(const Pixels& pixels, int left, int top, int scale) {
         for (int x = left; x < left + scale; ++x) {
             const std::uint32_t pixel = pixels.at(x, y);
             for (int i = 0; i < channelCount; ++i) {
-                sum.at(static_cast<std::size_t>(i)) += channel(pixel, i);
+                sum[static_cast<std::size_t>(i)] += channel(pixel, i);
             }
         }
     }
@@ -113,28 +113,52 @@ Pixels shrink(Pixels pixels, int scale) {
 
 using Color = std::array<int, channelCount>;
 
-/// Returns: the mean of the pixel and its neighbours, times nine.
-Color blur(const Pixels& pixels, int x, int y) {
-    Color sum{};
-    for (int dy = -1; dy <= 1; ++dy) {
-        for (int dx = -1; dx <= 1; ++dx) {
-            const std::uint32_t pixel = pixels.at(x + dx, y + dy);
-            for (int i = 0; i < channelCount; ++i) {
-                sum.at(static_cast<std::size_t>(i)) += channel(pixel, i);
-            }
-        }
-    }
-    return sum;
+using Colors = std::vector<Color>;
+
+Color getColor(std::uint32_t pixel) {
+    return {channel(pixel, 0), channel(pixel, 1), channel(pixel, 2)};
 }
 
-/// Returns: whether a viewer sees a difference at this place.
-bool differs(const Pixels& one, const Pixels& other, int x, int y) {
+void add(Color& sum, const Color& color) {
+    for (std::size_t i = 0; i < sum.size(); ++i) {
+        sum[i] += color[i];
+    }
+}
+
+/// Returns: for each pixel the sum of it and its neighbours in the row.
+Colors sumRows(const Pixels& pixels, int width, int height) {
+    Colors sums;
+    sums.reserve(static_cast<std::size_t>(width) * height);
+    for (int y = 0; y < height; ++y) {
+        for (int x = 0; x < width; ++x) {
+            Color sum = getColor(pixels.at(x, y));
+            add(sum, getColor(pixels.at(x - 1, y)));
+            add(sum, getColor(pixels.at(x + 1, y)));
+            sums.push_back(sum);
+        }
+    }
+    return sums;
+}
+
+/// Returns: for each pixel the mean of it and its neighbours, times nine.
+Colors blur(const Pixels& pixels, int width, int height) {
+    const Colors rows = sumRows(pixels, width, height);
+    const Color edge = {3 * 255, 3 * 255, 3 * 255};
+    Colors sums = rows;
+    for (std::size_t i = 0; i < sums.size(); ++i) {
+        const std::size_t below = i + static_cast<std::size_t>(width);
+        add(sums[i], i >= static_cast<std::size_t>(width) ? rows[i - width] : edge);
+        add(sums[i], below < rows.size() ? rows[below] : edge);
+    }
+    return sums;
+}
+
+/// Returns: whether a viewer sees a difference between these colours, times nine.
+bool differs(const Color& one, const Color& other) {
     constexpr int neighbours = 9;
-    const Color first = blur(one, x, y);
-    const Color second = blur(other, x, y);
     int largest = 0;
-    for (std::size_t i = 0; i < first.size(); ++i) {
-        largest = std::max(largest, std::abs(first.at(i) - second.at(i)));
+    for (std::size_t i = 0; i < one.size(); ++i) {
+        largest = std::max(largest, std::abs(one[i] - other[i]));
     }
     return largest > visible * neighbours;
 }
@@ -161,11 +185,14 @@ Comparison compare(const Pixels& expected, const Pixels& page) {
     Comparison result;
     result.width = commonExtent(expected.width, page.width);
     result.height = commonExtent(expected.height, page.height);
+    const Colors first = blur(expected, result.width, result.height);
+    const Colors second = blur(page, result.width, result.height);
     for (int y = 0; y < result.height; ++y) {
         for (int x = 0; x < result.width; ++x) {
+            const std::size_t index = static_cast<std::size_t>(y) * result.width + x;
             const bool isOutside = x >= std::min(expected.width, page.width) ||
                                    y >= std::min(expected.height, page.height);
-            result.isDifferent.push_back(isOutside || differs(expected, page, x, y));
+            result.isDifferent.push_back(isOutside || differs(first[index], second[index]));
         }
     }
     return result;

@@ -7,6 +7,8 @@ namespace DrawmereConvert {
 namespace {
 
 constexpr std::size_t minScaledPoints = 40;
+constexpr MoxColor white(255, 255, 255);
+
 constexpr std::size_t maxTextPoints = 20000; // no viewer likes endless paths
 
 MoxPointT<MoxLength> place(const fz_point& point, float scale) {
@@ -77,7 +79,7 @@ bool Canvas::isWorthScaling() const {
 }
 
 void Canvas::drawScaled() {
-    countElement();
+    ++elements;
     out.pushState();
     settings.save(/*isDefinition=*/false);
     transform(fz_scale(1 / PathData::stepsPerPoint, 1 / PathData::stepsPerPoint));
@@ -101,13 +103,20 @@ void Canvas::stroke(const PathData& path, const Paint& paint, const Pen& pen) {
     }
     const fz_point& from = path.points[0];
     const fz_point& to = path.points[1];
-    countElement();
+    beginElement();
     out.drawLine(pt(from.x), pt(from.y), pt(to.x), pt(to.y), PAINTMODE_STROKE);
+    endElement();
 }
 
 void Canvas::strokeWaiting(const Paint& paint, const Pen& pen) {
     const int alpha = paint.color.getAlpha();
-    if (hidesFills && paint.color.hasAlpha() && waiting.paint.color.getAlpha() == alpha) {
+    const bool hides = hidesFills && paint.color.hasAlpha();
+    const bool isEven = waiting.paint.color.getAlpha() == alpha;
+    if (hides && !isEven && hasDefinitions() && effects.mask.isEmpty()) {
+        strokeHiding(paint, pen);
+        return;
+    }
+    if (hides && isEven) {
         Paint inside = waiting.paint;
         Paint outline = paint;
         inside.color.clearAlpha();
@@ -125,13 +134,34 @@ void Canvas::strokeWaiting(const Paint& paint, const Pen& pen) {
     waiting.path.clear();
 }
 
+// The fill is drawn through a mask that leaves out the outline.
+void Canvas::strokeHiding(const Paint& paint, const Pen& pen) {
+    const std::int64_t before = elements;
+    const WaitingFill shape = std::exchange(waiting, {});
+    const fz_rect area = fz_expand_rect(shape.path.getBounds(), 1);
+    const Effects outside = effects;
+    Effects inside = effects;
+    inside.mask = beginMask(area);
+    settings.setFill({white});
+    settings.setNoStroke();
+    out.drawRect(pt(area.x0), pt(area.y0), pt(area.x1 - area.x0), pt(area.y1 - area.y0), pt(0),
+                 pt(0), PAINTMODE_FILL);
+    stroke(shape.path, {MoxColor()}, pen);
+    endMask();
+    setEffects(inside);
+    fill(shape.path, shape.isEvenOdd, shape.paint);
+    setEffects(outside);
+    stroke(shape.path, paint, pen);
+    elements = before + 1; // as it looks like one
+}
+
 void Canvas::setKnockout(bool isKnockout) {
     flush();
     hidesFills = isKnockout;
 }
 
 void Canvas::drawShape(const PathData& path, bool isEvenOdd, PAINTMODE mode) {
-    countElement();
+    beginElement();
     const bool isStroked = (mode & PAINTMODE_STROKE) != 0;
     fz_rect rect;
     // Dashes begin at the first corner, which a rectangle doesn't keep.
@@ -139,10 +169,28 @@ void Canvas::drawShape(const PathData& path, bool isEvenOdd, PAINTMODE mode) {
         settings.setFillRule(FILLRULE_EVENODD);
         out.drawRect(pt(rect.x0), pt(rect.y0), pt(rect.x1 - rect.x0), pt(rect.y1 - rect.y0), pt(0),
                      pt(0), mode);
-        return;
+    } else {
+        settings.setFillRule(isEvenOdd ? FILLRULE_EVENODD : FILLRULE_NONZERO);
+        drawPath(path, mode);
     }
-    settings.setFillRule(isEvenOdd ? FILLRULE_EVENODD : FILLRULE_NONZERO);
-    drawPath(path, mode);
+    endElement();
+}
+
+// The library puts the mask of the first element on the group around it, where it would hold for
+// the next ones, too.
+void Canvas::beginElement() {
+    ++elements;
+    if (!effects.mask.isEmpty()) {
+        out.pushState();
+        settings.save(/*isDefinition=*/false);
+    }
+}
+
+void Canvas::endElement() {
+    if (!effects.mask.isEmpty()) {
+        out.popState();
+        settings.restore();
+    }
 }
 
 void Canvas::drawPath(const PathData& path, PAINTMODE mode, float scale) {

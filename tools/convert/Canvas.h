@@ -79,8 +79,9 @@ public:
     /// Draws the fill that waits.
     void flush();
 
-    /// Counts an element that was drawn through `out`.
-    void countElement() { ++elements; }
+    /// To be called around an element that is drawn through `out`.
+    void beginElement();
+    void endElement();
 
     /// Returns: how many elements were drawn, without what only contains others.
     std::int64_t getElementCount() const { return elements; }
@@ -100,6 +101,7 @@ private:
 
     void wait(const PathData& path, bool isEvenOdd, bool isText, const Paint& paint);
     void strokeWaiting(const Paint& paint, const Pen& pen);
+    void strokeHiding(const Paint& paint, const Pen& pen);
     void drawShape(const PathData& path, bool isEvenOdd, PAINTMODE mode);
     void drawPath(const PathData& path, PAINTMODE mode, float scale = 1);
     bool isWorthScaling() const;

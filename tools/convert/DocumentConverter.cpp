@@ -125,7 +125,8 @@ PageReport DocumentConverter::drawPage(const PagePlace& place, const PageTargets
     const fz_matrix matrix = fz_translate(-bounds.x0, place.offset - bounds.y0);
     PagePainter painter(file->ctx, options, *outlines, *fonts, report, drawmere,
                         {0, place.offset, size.width, bottom},
-                        [&](GroupScan& scan) { scan.run(file->ctx, file->page, matrix); });
+                        [&](GroupScan& scan) { scan.run(file->ctx, file->page, matrix); },
+                        {file->page, matrix, &file->cookie});
     if (!place.isSingle) {
         painter.clipToPage();
     }

@@ -88,4 +88,13 @@ void ImagePixels::readMaskRow(int y, std::vector<std::uint8_t>& row) const {
     }
 }
 
+PlacedPixels::PlacedPixels(fz_context* context, fz_pixmap* newPixels, float scale)
+    : pixels(std::make_unique<ImagePixels>(context, newPixels)),
+      matrix{static_cast<float>(newPixels->w) / scale,
+             0,
+             0,
+             static_cast<float>(newPixels->h) / scale,
+             static_cast<float>(newPixels->x) / scale,
+             static_cast<float>(newPixels->y) / scale} {}
+
 } // namespace DrawmereConvert

@@ -4,6 +4,7 @@
 #include <mupdf/fitz.h>
 
 #include <cstdint>
+#include <memory>
 #include <vector>
 
 namespace DrawmereConvert {
@@ -40,6 +41,17 @@ private:
 
     fz_context* ctx;
     fz_pixmap* pixmap = nullptr; // owned: grey, RGB or alpha alone
+};
+
+/// Pixels of a part of the page.
+struct PlacedPixels {
+    PlacedPixels() = default;
+
+    /// Takes over `pixels`, `scale` of which are a point long; they know where they are.
+    PlacedPixels(fz_context* context, fz_pixmap* pixels, float scale);
+
+    std::unique_ptr<ImagePixels> pixels; ///< null when nothing could be drawn
+    fz_matrix matrix = fz_identity;      ///< where the unit square goes
 };
 
 } // namespace DrawmereConvert

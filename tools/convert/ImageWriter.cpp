@@ -200,8 +200,9 @@ void ImageWriter::drawUnit(const ImageFile& file, float width, float height, flo
     if (isLarge) {
         config.setImageProcessingType(MoxName(u"copy"));
     }
-    canvas.countElement();
+    canvas.beginElement();
     canvas.out.drawImage(&image, image.getGraphicType(), pt(width), pt(height), pt(x), pt(y));
+    canvas.endElement();
     if (isLarge) {
         config.setImageProcessingType(chosen);
     }

@@ -112,7 +112,7 @@ void Layers::pushImageMask(fz_image* image, const fz_matrix& matrix) {
 }
 
 void Layers::pushTracedMask(const PathData& path) {
-    nextGroup += isReplaying ? 0 : 1; // looking ahead counts it among the groups
+    skipFacts(); // looking ahead counts it among the groups
     pushClip(path, /*isEvenOdd=*/false);
 }
 

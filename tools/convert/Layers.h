@@ -98,6 +98,12 @@ public:
     /// Closes everything.
     void finish();
 
+    /// Returns: whether drawing goes to the page itself.
+    bool isOnPage() const { return scopes.size() == 1 && !isReplaying; }
+
+    /// Leaves out one of what opens, which looking ahead has counted.
+    void skipFacts() { nextGroup += isReplaying ? 0 : 1; }
+
     bool isReplaying = false; ///< what comes now was not seen when looking ahead
 
 private:

@@ -29,10 +29,26 @@ template <class Call> bool tryPainter(PagePainter& painter, const Call& call) no
 }
 
 /// Runs `call` with the painter; a failure becomes one of MuPDF, which ends the page.
-template <class Call> void paint(fz_context* ctx, fz_device* device, const Call& call) {
+template <class Call> void handOn(fz_context* ctx, fz_device* device, const Call& call) {
     if (!tryPainter(getPainter(device), call)) {
         fz_throw(ctx, FZ_ERROR_ABORT, "the page can't be drawn");
     }
+}
+
+/// The same, for what is left out where a picture shows it.
+template <class Call> void paint(fz_context* ctx, fz_device* device, const Call& call) {
+    if (!getPainter(device).isSkipping()) {
+        handOn(ctx, device, call);
+    }
+}
+
+/// The same, for an opening that was counted when looking ahead.
+template <class Call> void paintCounted(fz_context* ctx, fz_device* device, const Call& call) {
+    if (getPainter(device).isSkipping()) {
+        getPainter(device).skipOpening();
+        return;
+    }
+    handOn(ctx, device, call);
 }
 
 void fillPath(fz_context* ctx, fz_device* device, const fz_path* path, int isEvenOdd,
@@ -86,14 +102,14 @@ void clipText(fz_context* ctx, fz_device* device, const fz_text* text, fz_matrix
 
 void clipStrokePath(fz_context* ctx, fz_device* device, const fz_path* path,
                     const fz_stroke_state* stroke, fz_matrix matrix, fz_rect /*scissor*/) {
-    paint(ctx, device,
-          [&](PagePainter& painter) { painter.clipStrokePath(path, *stroke, matrix); });
+    paintCounted(ctx, device,
+                 [&](PagePainter& painter) { painter.clipStrokePath(path, *stroke, matrix); });
 }
 
 void clipStrokeText(fz_context* ctx, fz_device* device, const fz_text* text,
                     const fz_stroke_state* stroke, fz_matrix matrix, fz_rect /*scissor*/) {
-    paint(ctx, device,
-          [&](PagePainter& painter) { painter.clipStrokeText(*text, *stroke, matrix); });
+    paintCounted(ctx, device,
+                 [&](PagePainter& painter) { painter.clipStrokeText(*text, *stroke, matrix); });
 }
 
 void fillShade(fz_context* ctx, fz_device* device, fz_shade* shade, fz_matrix matrix, float alpha,
@@ -115,7 +131,7 @@ void fillImageMask(fz_context* ctx, fz_device* device, fz_image* image, fz_matri
 
 void clipImageMask(fz_context* ctx, fz_device* device, fz_image* image, fz_matrix matrix,
                    fz_rect /*scissor*/) {
-    paint(ctx, device, [&](PagePainter& painter) { painter.clipImageMask(image, matrix); });
+    paintCounted(ctx, device, [&](PagePainter& painter) { painter.clipImageMask(image, matrix); });
 }
 
 void popClip(fz_context* ctx, fz_device* device) {
@@ -134,17 +150,18 @@ void beginMask(fz_context* ctx, fz_device* device, fz_rect area, int luminosity,
 }
 
 void endMask(fz_context* ctx, fz_device* device) {
-    paint(ctx, device, [](PagePainter& painter) { painter.endMask(); });
+    paintCounted(ctx, device, [](PagePainter& painter) { painter.endMask(); });
 }
 
 void beginGroup(fz_context* ctx, fz_device* device, fz_rect area, fz_colorspace* /*space*/,
                 int /*isolated*/, int knockout, int blendMode, float alpha) {
-    paint(ctx, device,
-          [&](PagePainter& painter) { painter.beginGroup(area, knockout != 0, blendMode, alpha); });
+    handOn(ctx, device, [&](PagePainter& painter) {
+        painter.beginGroup(area, knockout != 0, blendMode, alpha);
+    });
 }
 
 void endGroup(fz_context* ctx, fz_device* device) {
-    paint(ctx, device, [](PagePainter& painter) { painter.endGroup(); });
+    handOn(ctx, device, [](PagePainter& painter) { painter.endGroup(); });
 }
 
 int beginTile(fz_context* ctx, fz_device* device, fz_rect area, fz_rect view, float xStep,

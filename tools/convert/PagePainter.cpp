@@ -26,11 +26,12 @@ fz_rect intersect(const fz_rect& one, const fz_rect& other) {
 PagePainter::PagePainter(fz_context* context, const ConvertOptions& chosen,
                          GlyphOutlines& glyphOutlines, FontBook& fontBook, PageReport& pageReport,
                          Drawmere& drawmere, const fz_rect& area,
-                         const std::function<void(GroupScan&)>& scanPage)
+                         const std::function<void(GroupScan&)>& scanPage, const PageRun& pageRun)
     : canvas(drawmere), colors(context), ctx(context), report(pageReport), options(chosen),
       outlines(glyphOutlines), fonts(fontBook), texts(canvas, chosen.textMode),
       images(context, chosen, canvas, report), shadings(context, canvas, colors),
-      layers(canvas, colors, images, report, area, chosen.maxDepth, scanPage) {}
+      layers(canvas, colors, images, report, area, chosen.maxDepth, scanPage),
+      blended(context, pageRun) {}
 
 // Paths.
 
@@ -212,7 +213,7 @@ void PagePainter::fillShade(fz_shade* shade, const fz_matrix& matrix, float alph
         return;
     }
     report.note(APPROXIMATION_SHADING);
-    const ShadingImage image = shadings.draw(shade, placed, area, options.shadeDpi);
+    const PlacedPixels image = shadings.draw(shade, placed, area, options.shadeDpi);
     if (image.pixels) {
         images.drawPixels(*image.pixels, image.matrix, alpha, colors.use);
     }
@@ -296,16 +297,53 @@ void PagePainter::beginMask(const fz_rect& area, bool isLuminosity, const MoxCol
 }
 
 void PagePainter::beginGroup(const fz_rect& area, bool isKnockout, int blendMode, float alpha) {
-    if (blendMode != FZ_BLEND_NORMAL) {
-        report.note(APPROXIMATION_BLEND);
+    const bool isBlended = blendMode != FZ_BLEND_NORMAL;
+    const std::size_t number = blendedCount;
+    blendedCount += isBlended ? 1 : 0;
+    const fz_rect placed = layers.placeArea(area);
+    if (isSkipping() || (isBlended && drawBlended(number, placed))) {
+        ++skippedGroups;
+        if (alpha < 1) {
+            layers.skipFacts();
+        }
+        return;
     }
-    layers.beginGroup(layers.placeArea(area), alpha);
+    layers.beginGroup(placed, alpha);
     canvas.setKnockout(isKnockout);
     groups.push_back({isKnockout, canvas.getElementCount()});
 }
 
+bool PagePainter::drawBlended(std::size_t number, const fz_rect& area) {
+    constexpr std::size_t maxPictures = 32; // as each draws the page anew
+    PlacedPixels picture;
+    BLENDING blending = BLENDING_UNKNOWN;
+    if (layers.isOnPage() && pictureCount < maxPictures) {
+        ++pictureCount;
+        blending =
+            blended.draw(number, intersect(area, layers.getVisible()), options.shadeDpi, picture);
+    }
+    if (blending != BLENDING_PICTURE) {
+        if (blending == BLENDING_UNKNOWN) {
+            report.note(APPROXIMATION_BLEND);
+        }
+        return false;
+    }
+    report.note(APPROXIMATION_MIXTURE);
+    const Effects before = canvas.getEffects();
+    canvas.setEffects({}); // which the picture has already
+    if (picture.pixels && layers.enter(fz_transform_rect(fz_unit_rect, picture.matrix))) {
+        images.drawPixels(*picture.pixels, picture.matrix, 1, colors.use);
+    }
+    canvas.setEffects(before);
+    return true;
+}
+
 // A single element, be it filled and stroked, has nothing to hide but itself.
 void PagePainter::endGroup() {
+    if (isSkipping()) {
+        --skippedGroups;
+        return;
+    }
     if (groups.empty()) {
         return;
     }

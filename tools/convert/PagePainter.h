@@ -1,6 +1,7 @@
 /// Draws what the interpreter of a page calls for.
 #pragma once
 
+#include "tools/convert/BlendedGroups.h"
 #include "tools/convert/Canvas.h"
 #include "tools/convert/ConvertOptions.h"
 #include "tools/convert/GlyphOutlines.h"
@@ -26,10 +27,11 @@ namespace DrawmereConvert {
 /// from MuPDF.
 class PagePainter {
 public:
-    /// Shape: `area`, where the page is in the document; `scanPage` looks ahead at it.
+    /// Shape: `area`, where the page is in the document; `scanPage` looks ahead at it; `pageRun`
+    /// runs it again.
     PagePainter(fz_context* context, const ConvertOptions& chosen, GlyphOutlines& glyphOutlines,
                 FontBook& fontBook, PageReport& pageReport, Drawmere& drawmere, const fz_rect& area,
-                const std::function<void(GroupScan&)>& scanPage);
+                const std::function<void(GroupScan&)>& scanPage, const PageRun& pageRun);
 
     void fillPath(const fz_path* path, bool isEvenOdd, const fz_matrix& matrix, const Paint& paint);
     void strokePath(const fz_path* path, const fz_stroke_state& style, const fz_matrix& matrix,
@@ -59,6 +61,12 @@ public:
 
     void endGroup();
 
+    /// Returns: whether what comes is part of a picture that is drawn already.
+    bool isSkipping() const { return skippedGroups > 0; }
+
+    /// Leaves out something that opens.
+    void skipOpening() { layers.skipFacts(); }
+
     void beginTile(const fz_rect& area, const fz_rect& cell, float xStep, float yStep,
                    const fz_matrix& matrix);
 
@@ -86,6 +94,8 @@ private:
                     const Paint& paint);
     /// Puts the outline of a small mask into `current`. Returns: false for one that has none.
     bool traceMask(fz_image* image, const fz_matrix& matrix);
+    /// Draws a group with a blend mode as a picture. Returns: false for one to be drawn otherwise.
+    bool drawBlended(std::size_t number, const fz_rect& area);
     void fillBackground(const fz_shade& shade, const fz_rect& area, float alpha);
 
     /// A group that is open.
@@ -103,6 +113,10 @@ private:
     ImageWriter images;
     ShadingWriter shadings;
     Layers layers;
+    BlendedGroups blended;
+    std::size_t blendedCount = 0; // of groups with a blend mode up to now
+    std::size_t pictureCount = 0;
+    int skippedGroups = 0; // open, of which the outermost is drawn as a picture
     std::vector<OpenGroup> groups;
     PathData current; // kept for its memory
 };

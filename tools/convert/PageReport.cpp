@@ -13,6 +13,7 @@ struct ApproximationWords {
 
 constexpr std::array<ApproximationWords, APPROXIMATION_COUNT> approximationWords = {{
     {"blend mode left out", "blend modes left out"},
+    {"blended group drawn as an image", "blended groups drawn as images"},
     {"knockout group drawn as a plain one", "knockout groups drawn as plain ones"},
     {"overprint left out", "overprints left out"},
     {"mask approximated", "masks approximated"},

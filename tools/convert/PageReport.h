@@ -12,6 +12,7 @@ namespace DrawmereConvert {
 /// What SVG 1.1 or the chosen options can't say exactly.
 enum APPROXIMATION : std::int32_t {
     APPROXIMATION_BLEND = 0, ///< drawn without its blend mode
+    APPROXIMATION_MIXTURE,   ///< a group with a blend mode drawn as an image
     APPROXIMATION_KNOCKOUT,  ///< a knockout group drawn as a plain one
     APPROXIMATION_OVERPRINT, ///< drawn without overprint
     APPROXIMATION_MASK,      ///< a mask put on parts one by one, or left out

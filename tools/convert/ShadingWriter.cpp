@@ -132,7 +132,7 @@ void ShadingWriter::writeStops(const std::vector<ShadingStop>& stops, bool start
     }
 }
 
-ShadingImage ShadingWriter::draw(fz_shade* shade, const fz_matrix& matrix, const fz_rect& area,
+PlacedPixels ShadingWriter::draw(fz_shade* shade, const fz_matrix& matrix, const fz_rect& area,
                                  int dpi) {
     const float side = std::max({area.x1 - area.x0, area.y1 - area.y0, 1.0F});
     const float scale = std::min(static_cast<float>(dpi) / pointsPerInch, maxSide / side);
@@ -140,9 +140,8 @@ ShadingImage ShadingWriter::draw(fz_shade* shade, const fz_matrix& matrix, const
     const fz_matrix placed = fz_concat(matrix, fz_scale(scale, scale));
     fz_pixmap* pixels = nullptr;
     fz_var(pixels);
-    ShadingImage image;
     if (fz_is_empty_irect(box)) {
-        return image;
+        return {};
     }
     const bool done = callFitz(ctx, [&] {
         pixels = fz_new_pixmap_with_bbox(ctx, fz_device_rgb(ctx), box, nullptr, 1);
@@ -152,18 +151,9 @@ ShadingImage ShadingWriter::draw(fz_shade* shade, const fz_matrix& matrix, const
     });
     if (!done) {
         fz_drop_pixmap(ctx, pixels);
-        return image;
+        return {};
     }
-    image.pixels = std::make_unique<ImagePixels>(ctx, pixels);
-    const auto width = static_cast<float>(box.x1 - box.x0);
-    const auto height = static_cast<float>(box.y1 - box.y0);
-    image.matrix = {width / scale,
-                    0,
-                    0,
-                    height / scale,
-                    static_cast<float>(box.x0) / scale,
-                    static_cast<float>(box.y0) / scale};
-    return image;
+    return {ctx, pixels, scale};
 }
 
 } // namespace DrawmereConvert

@@ -8,16 +8,9 @@
 
 #include <mupdf/fitz.h>
 
-#include <memory>
 #include <vector>
 
 namespace DrawmereConvert {
-
-/// An image of a part of the page.
-struct ShadingImage {
-    std::unique_ptr<ImagePixels> pixels; ///< null when nothing could be drawn
-    fz_matrix matrix = fz_identity;      ///< where the unit square goes
-};
 
 /// Defines gradients in one document; one that comes again is found again.
 class ShadingWriter {
@@ -33,7 +26,7 @@ public:
     UnicodeString define(fz_shade* shade, const fz_matrix& matrix);
 
     /// Draws the part `area` of `shade` as pixels.
-    ShadingImage draw(fz_shade* shade, const fz_matrix& matrix, const fz_rect& area, int dpi);
+    PlacedPixels draw(fz_shade* shade, const fz_matrix& matrix, const fz_rect& area, int dpi);
 
 private:
     struct Circle {

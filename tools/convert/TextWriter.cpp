@@ -205,12 +205,13 @@ void TextWriter::flushLine(const TextSpan& span, const TextPaint& paint) {
     } else {
         span.font.describePlain(span.size, font);
     }
+    canvas.beginElement();
     setPaint(paint);
     canvas.out.setFont(&font, file);
     TalFont::TLStringWithGlyphInfo glyphs(line.glyphs);
-    canvas.countElement();
     canvas.out.drawText(line.text, x, {pt(line.y)}, {}, paint.mode, &glyphs, /*wholeRun=*/false,
                         /*leftToRight=*/true);
+    canvas.endElement();
     line = Line();
 }
 
