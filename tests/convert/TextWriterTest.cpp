@@ -4,6 +4,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 namespace DrawmereTest {
 namespace {
 
@@ -22,6 +24,12 @@ DrawnPage drawText(const std::string& operators, TEXTMODE mode) {
     ConvertOptions options;
     options.textMode = mode;
     return DrawnPage({"BT /F 20 Tf 10 40 Td " + operators + " ET", helvetica}, options);
+}
+
+/// Returns: the tag of the first text.
+std::string findText(const DrawnPage& page) {
+    const std::size_t start = std::min(page.svg.find("<text x="), page.svg.size());
+    return page.svg.substr(start, page.svg.find('>', start) - start + 1);
 }
 
 TEST(OutlineText, ARunOfGlyphsIsOnePath) {
@@ -75,10 +83,74 @@ TEST(TextWriter, TurnedTextHasAMatrix) {
     EXPECT_THAT(page.body(), HasSubstr("transform=\"rotate(-90)\""));
 }
 
-TEST(TextWriter, EmbeddedOutlinesFillByTheirOwnRule) {
-    EXPECT_EQ(drawText("(o) Tj", TEXTMODE_FONTS).svg.find("fill-rule=\"nonzero\""),
-              drawText("(o) Tj", TEXTMODE_FONTS).svg.rfind("fill-rule=\"nonzero\""));
-    EXPECT_THAT(drawText("(o) Tj", TEXTMODE_FONTS).svg, HasSubstr("fill-rule=\"nonzero\""));
+TEST(TextWriter, OutlinesThatOverlapFillByTheirOwnRule) {
+    EXPECT_EQ(findText(drawText("(o) Tj", TEXTMODE_FONTS)), "<text x=\"10\" y=\"60\">");
+    ConvertOptions options;
+    options.textMode = TEXTMODE_FONTS;
+    const DrawnPage page(Conversion::document("corruptionOneByteMissing.pdf"), 0, options);
+    EXPECT_THAT(page.svg, HasSubstr("fill-rule=\"nonzero\">"));
+}
+
+TEST(TextWriter, WordsThatAreEquallyFarApartNeedOnePosition) {
+    const DrawnPage page = drawText("[(an) -500 (old) -1000 (one)] TJ", TEXTMODE_FONTS);
+    EXPECT_EQ(page.texts(), std::vector<std::string>{"an old  one"});
+    // Ten points, less the blank of the font.
+    EXPECT_EQ(findText(page), "<text x=\"10\" y=\"60\" word-spacing=\"4.44\">");
+    EXPECT_THAT(page.svg, HasSubstr("<glyph unicode=\" \" d=\"\""));
+}
+
+TEST(TextWriter, WordSpacingIsNotLeftBehind) {
+    const DrawnPage page = drawText("[(an) -500 (old)] TJ 0 -20 Td (one) Tj", TEXTMODE_FONTS);
+    EXPECT_EQ(page.svg.find("word-spacing"), page.svg.rfind("word-spacing"));
+}
+
+TEST(TextWriter, WordsThatAreNotKeepTheirPositions) {
+    const DrawnPage page = drawText("[(an) -500 (old) -700 (one)] TJ", TEXTMODE_FONTS);
+    EXPECT_EQ(page.texts(), std::vector<std::string>{"anoldone"});
+    EXPECT_THAT(findText(page), HasSubstr("<text x=\"10 21.1"));
+}
+
+TEST(TextWriter, AProfileWithoutWordSpacingGetsPositions) {
+    ConvertOptions options;
+    options.textMode = TEXTMODE_FONTS;
+    const DrawnPage page({"BT /F 20 Tf 10 40 Td [(an) -500 (old)] TJ ET", helvetica}, options,
+                         DrawmereNS::SVGConfig::SVGTYPE_TINY);
+    EXPECT_EQ(page.texts(), std::vector<std::string>{"anold"});
+}
+
+/// Draws a text in which the glyph of A stands for the letters fi.
+DrawnPage drawLigature(const std::string& operators) {
+    ConvertOptions options;
+    options.textMode = TEXTMODE_FONTS;
+    const std::string font =
+        "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica/ToUnicode 5 0 R>>>>";
+    const std::string map = "1 begincodespacerange <00> <ff> endcodespacerange\n"
+                            "1 beginbfchar <41> <00660069> endbfchar\n"
+                            "1 beginbfrange <61> <7a> <0061> endbfrange\n";
+    return DrawnPage({"BT /F 20 Tf 10 40 Td " + operators + " ET", font, {{"", map}}}, options);
+}
+
+TEST(TextWriter, ALigatureKeepsItsLettersAndThePlaceInItsLine) {
+    const DrawnPage page = drawLigature("[(a) -50 (bAcd)] TJ");
+    EXPECT_EQ(page.texts(), std::vector<std::string>{"abficd"});
+    EXPECT_EQ(findText(page), "<text x=\"10 22.12\" y=\"60\">");
+    EXPECT_THAT(page.svg, HasSubstr("<glyph unicode=\"fi\""));
+}
+
+TEST(TextWriter, TheLettersOfALigatureHaveNoPositions) {
+    const DrawnPage page = drawLigature("[(a) -50 (A) -50 (c)] TJ");
+    EXPECT_EQ(page.texts(), (std::vector<std::string>{"afi", "c"}));
+    EXPECT_EQ(findText(page), "<text x=\"10 22.12\" y=\"60\">");
+}
+
+TEST(TextWriter, LettersThatALigatureStandsForArePlacedOneByOne) {
+    EXPECT_EQ(drawLigature("(Aafi) Tj").texts(), (std::vector<std::string>{"fiaf", "i"}));
+}
+
+TEST(TextWriter, ALigatureOfLettersThatWereNotOneIsInAFontOfItsOwn) {
+    const DrawnPage page = drawLigature("(fia) Tj (A) Tj");
+    EXPECT_EQ(page.texts(), (std::vector<std::string>{"fia", "fi"}));
+    EXPECT_EQ(page.count("font"), 2);
 }
 
 TEST(TextWriter, PlainTextNamesFamiliesAndPlacesEachCharacter) {

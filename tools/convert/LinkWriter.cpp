@@ -3,7 +3,7 @@
 namespace DrawmereConvert {
 namespace {
 
-const Paint unseen{MoxColor(255, 255, 255, 0)};
+const Paint unseen{MoxColor(0, 0, 0, 0)}; // black is what the root says anyway
 
 PathData toPath(const fz_rect& rect) {
     PathData path;

@@ -1,5 +1,6 @@
 #include "tools/convert/TextFont.h"
 
+#include "tools/convert/FillRules.h"
 #include "tools/convert/FitzCall.h"
 
 #include <ft2build.h>
@@ -41,6 +42,15 @@ std::string keepPlain(const std::string& name) {
 
 /// Returns: `name` without the style behind a hyphen or comma.
 std::string dropStyle(const std::string& name) { return name.substr(0, name.find_first_of("-,")); }
+
+/// Returns: a number of its own for each pair of ASCII characters.
+std::optional<std::size_t> numberPair(char16_t first, char16_t second) {
+    constexpr char16_t end = 128;
+    if (first >= end || second >= end) {
+        return std::nullopt;
+    }
+    return static_cast<std::size_t>(first) * end + second;
+}
 
 std::string makeDigest(fz_context* ctx, fz_font* font) {
     constexpr const char* digits = "0123456789abcdef";
@@ -126,22 +136,85 @@ std::unique_ptr<FS_ExtraFonts> TextFont::loadFile(const UnicodeString& fileName)
     return isRead ? std::move(file) : nullptr;
 }
 
+/// Returns: false when the text stands for another glyph, or would be one where its letters are
+/// not.
+bool TextFont::take(Variant& variant, const std::u16string& text, int glyph) {
+    const auto known = variant.glyphs.find(text);
+    if (known != variant.glyphs.end()) {
+        return known->second == glyph;
+    }
+    std::vector<std::size_t> pairs;
+    for (std::size_t i = 1; i < text.size(); ++i) {
+        if (const std::optional<std::size_t> pair = numberPair(text[i - 1], text[i])) {
+            pairs.push_back(*pair);
+        }
+    }
+    if (std::ranges::any_of(pairs, [&](std::size_t pair) { return variant.loose.test(pair); })) {
+        return false;
+    }
+    std::ranges::for_each(pairs, [&](std::size_t pair) { variant.inLigature.set(pair); });
+    variant.glyphs.emplace(text, glyph);
+    return true;
+}
+
 int TextFont::findVariant(const std::u16string& text, int glyph, int preferred) {
-    const auto fits = [&](std::size_t variant) {
-        return variants[variant].try_emplace(text, glyph).first->second == glyph;
-    };
     const auto first = static_cast<std::size_t>(preferred);
-    if (first < variants.size() && fits(first)) {
+    if (first < variants.size() && take(variants[first], text, glyph)) {
         return preferred;
     }
     std::size_t variant = 0;
-    while (variant < variants.size() && !fits(variant)) {
+    while (variant < variants.size() && !take(variants[variant], text, glyph)) {
         ++variant;
     }
     if (variant == variants.size()) {
-        variants.emplace_back()[text] = glyph;
+        take(variants.emplace_back(), text, glyph);
     }
     return static_cast<int>(variant);
+}
+
+bool TextFont::joinLetters(int variant, char16_t first, char16_t second) {
+    const std::optional<std::size_t> pair = numberPair(first, second);
+    Variant& used = variants[static_cast<std::size_t>(variant)];
+    if (!pair) {
+        return true;
+    }
+    if (used.inLigature.test(*pair)) {
+        return false;
+    }
+    used.loose.set(*pair);
+    return true;
+}
+
+std::optional<int> TextFont::findBlank(int variant) {
+    const Variant& used = variants[static_cast<std::size_t>(variant)];
+    const auto known = used.glyphs.find(u" ");
+    if (known != used.glyphs.end()) {
+        return showsNothing(known->second) ? std::optional(known->second) : std::nullopt;
+    }
+    const FT_Face face = faceOf(ctx, font);
+    for (const int glyph : {face ? static_cast<int>(FT_Get_Char_Index(face, U' ')) : 0, 0}) {
+        if (showsNothing(glyph)) {
+            return glyph;
+        }
+    }
+    return std::nullopt;
+}
+
+bool TextFont::showsNothing(int glyph) {
+    const FT_Face face = faceOf(ctx, font);
+    return face && FT_Load_Glyph(face, static_cast<FT_UInt>(glyph), FT_LOAD_NO_SCALE) == 0 &&
+           face->glyph->format == FT_GLYPH_FORMAT_OUTLINE && face->glyph->outline.n_contours == 0;
+}
+
+bool TextFont::isFilledAlike(int glyph) {
+    std::optional<bool>& answer = findGlyph(glyph).isFilledAlike;
+    if (!answer) {
+        const FT_Face face = faceOf(ctx, font);
+        answer = face && FT_Load_Glyph(face, static_cast<FT_UInt>(glyph), FT_LOAD_NO_SCALE) == 0 &&
+                 face->glyph->format == FT_GLYPH_FORMAT_OUTLINE &&
+                 DrawmereConvert::isFilledAlike(face->glyph->outline);
+    }
+    return *answer;
 }
 
 FS_ExtraFonts* TextFont::describe(int variant, float size, SVGFont& out) {
@@ -165,12 +238,16 @@ void TextFont::describePlain(float size, SVGFont& out) const {
     out.fontFamily = family; // several names, of which only some need quotes
 }
 
-float TextFont::getAdvance(int glyph) {
+TextFont::Glyph& TextFont::findGlyph(int glyph) {
     const auto index = static_cast<std::size_t>(glyph);
-    if (index >= advances.size()) {
-        advances.resize(index + 1, -1.0F);
+    if (index >= knownGlyphs.size()) {
+        knownGlyphs.resize(index + 1);
     }
-    float& advance = advances[index];
+    return knownGlyphs[index];
+}
+
+float TextFont::getAdvance(int glyph) {
+    float& advance = findGlyph(glyph).advance;
     if (advance < 0) {
         const FT_Face face = faceOf(ctx, font);
         FT_Fixed units = 0;

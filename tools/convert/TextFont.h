@@ -6,7 +6,9 @@
 
 #include <mupdf/fitz.h>
 
+#include <bitset>
 #include <memory>
+#include <optional>
 #include <string>
 #include <unordered_map>
 #include <vector>
@@ -36,6 +38,16 @@ public:
     /// Returns: the variant in which `text` stands for `glyph`: `preferred` when that will do.
     int findVariant(const std::u16string& text, int glyph, int preferred);
 
+    /// Notes that two characters follow each other in a variant, with no position for the second.
+    /// Returns: false, and notes nothing, when viewers would take them for a ligature.
+    bool joinLetters(int variant, char16_t first, char16_t second);
+
+    /// Returns: a glyph that a blank can stand for in a variant, or nothing.
+    std::optional<int> findBlank(int variant);
+
+    /// Returns: whether the outline of a glyph looks alike by both rules of filling.
+    bool isFilledAlike(int glyph);
+
     /// Fills `font` and returns the file of an embedded font, or null for a font that is only
     /// named.
     FS_ExtraFonts* describe(int variant, float size, SVGFont& font);
@@ -48,19 +60,35 @@ public:
     void startDocument() { variants.clear(); }
 
 private:
-    using GlyphsByText = std::unordered_map<std::u16string, int>;
+    /// What one variant has been used for in the document in hand. Pairs are of ASCII characters.
+    struct Variant {
+        using Pairs = std::bitset<128UL * 128UL>;
+
+        std::unordered_map<std::u16string, int> glyphs;
+        Pairs loose;      // letters that follow each other
+        Pairs inLigature; // letters of one glyph
+    };
+
+    /// What is known of a glyph of the file; nothing at first.
+    struct Glyph {
+        float advance = -1; // as a part of the em, below 0 when not read yet
+        std::optional<bool> isFilledAlike;
+    };
 
     void readNames();
     std::unique_ptr<FS_ExtraFonts> loadFile(const UnicodeString& name) const;
     UnicodeString makeName(int variant) const;
+    static bool take(Variant& variant, const std::u16string& text, int glyph);
+    bool showsNothing(int glyph);
+    Glyph& findGlyph(int glyph);
 
     fz_context* ctx;
     fz_font* font;
     UnicodeString name;   // tells this file from all others
     UnicodeString family; // a list for viewers that have the font or one like it
     std::vector<std::unique_ptr<FS_ExtraFonts>> files; // by variant
-    std::vector<GlyphsByText> variants;                // of the document in hand
-    std::vector<float> advances;                       // by glyph, below 0 when not read yet
+    std::vector<Variant> variants;                     // of the document in hand
+    std::vector<Glyph> knownGlyphs;
     bool isTried = false;
 };
 

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <numeric>
 
 namespace DrawmereConvert {
 namespace {
@@ -15,6 +16,12 @@ constexpr int unknownCharacter = 0xFFFD;
 float round(float value, float steps) { return std::rint(value * steps) / steps; }
 
 float toHundredth(float value) { return round(value, 100.0F); }
+
+/// Returns: the number with the fewest digits that is close enough.
+float shorten(float value) {
+    const float tenth = round(value, 10.0F);
+    return std::abs(tenth - value) < closeEnough ? tenth : toHundredth(value);
+}
 
 /// Returns: whether XML can carry the character and a viewer shows it in its place.
 bool isShown(int character) {
@@ -144,13 +151,13 @@ void TextWriter::write(const TextSpan& span, const TextPaint& paint) {
         const int variant = mode == TEXTMODE_FONTS
                                 ? span.font.findVariant(cluster.text, cluster.glyph, line.variant)
                                 : 0;
-        if (startsLine(cluster, variant)) {
+        const bool isNext = follows(cluster, variant, span.font);
+        if (!isNext && startsLine(cluster, variant)) {
             flushLine(span, paint);
             line.variant = variant;
             line.y = toHundredth(cluster.at.y);
-            line.isLigature = cluster.text.size() > 1;
         }
-        add(cluster);
+        add(cluster, isNext, span.font);
     }
     flushLine(span, paint);
     if (span.isTurned) {
@@ -158,42 +165,144 @@ void TextWriter::write(const TextSpan& span, const TextPaint& paint) {
     }
 }
 
-// Viewers take a ligature for its letters wherever they follow each other, and lose its shape where
-// each letter has a position: so it stands alone. In a font of the viewer there is no ligature.
-bool TextWriter::startsLine(const TextSpan::Cluster& cluster, int variant) const {
-    if (line.text.isEmpty()) {
-        return true;
-    }
-    const bool isLigature = mode == TEXTMODE_FONTS && cluster.text.size() > 1;
-    return variant != line.variant || std::abs(cluster.at.y - line.y) > closeEnough || isLigature ||
-           (mode == TEXTMODE_FONTS && line.isLigature) || line.x.size() >= maxLine;
+/// Returns: whether the cluster is where it belongs without a position of its own. In a font of the
+/// viewer nobody knows; and the viewer puts it in order where there is another direction.
+bool TextWriter::follows(const TextSpan::Cluster& cluster, int variant, TextFont& font) const {
+    return mode == TEXTMODE_FONTS && !line.clusters.empty() && variant == line.variant &&
+           !cluster.isRightToLeft && !line.clusters.back()->isRightToLeft &&
+           std::abs(cluster.at.y - line.y) <= closeEnough &&
+           std::abs(line.next - cluster.at.x) <= closeEnough &&
+           font.joinLetters(variant, line.clusters.back()->text.back(), cluster.text.front());
 }
 
-void TextWriter::add(const TextSpan::Cluster& cluster) {
+// Viewers lose the shape of a ligature when each of its letters has a position: so it is among
+// those without. In a font of the viewer there is no ligature.
+bool TextWriter::startsLine(const TextSpan::Cluster& cluster, int variant) const {
+    return line.clusters.empty() || variant != line.variant || line.hasLigature ||
+           std::abs(cluster.at.y - line.y) > closeEnough || line.x.size() >= maxLine;
+}
+
+void TextWriter::add(const TextSpan::Cluster& cluster, bool isNext, TextFont& font) {
+    const bool embeds = mode == TEXTMODE_FONTS;
     const std::size_t count = cluster.text.size();
-    const float x = toHundredth(cluster.at.x);
-    // What follows by itself is put in order by the viewer, where there is another direction.
-    const bool isOrdered = cluster.isRightToLeft || line.endsRightToLeft;
-    line.endsRightToLeft = cluster.isRightToLeft;
-    const bool follows = mode == TEXTMODE_FONTS && !line.x.empty() && !isOrdered &&
-                         std::abs(line.next - cluster.at.x) <= closeEnough;
+    const float x = shorten(cluster.at.x);
     // In a font of the viewer the characters of a ligature share its room.
     const float step = cluster.advance / static_cast<float>(count);
     for (std::size_t i = 0; i < count; ++i) {
-        line.x.push_back(toHundredth(x + step * static_cast<float>(i)));
+        line.x.push_back(i == 0 ? x : shorten(cluster.at.x + step * static_cast<float>(i)));
     }
-    if (!follows) {
-        line.placed = mode == TEXTMODE_FONTS ? line.x.size() - count + 1 : line.x.size();
+    if (!isNext) {
+        line.placed = embeds ? line.x.size() - count + 1 : line.x.size();
     }
-    line.next = (follows ? line.next : x) + cluster.advance;
+    line.next = (isNext ? line.next : x) + cluster.advance;
+    line.hasLigature = line.hasLigature || (embeds && count > 1);
+    line.hasRightToLeft = line.hasRightToLeft || cluster.isRightToLeft;
+    line.isFilledAlike = line.isFilledAlike && (!embeds || font.isFilledAlike(cluster.glyph));
+    line.clusters.push_back(&cluster);
     line.text.append(cluster.text.data(), static_cast<std::int32_t>(count));
     line.glyphs.push_back(
         {static_cast<std::int16_t>(count), static_cast<std::uint16_t>(cluster.glyph)});
 }
 
+/// Puts blanks into a line where words are that far apart, when it needs no further position then.
+void TextWriter::fillGaps(const TextSpan& span) {
+    const std::optional<int> blank = span.font.findBlank(line.variant);
+    std::optional<Gaps> gaps = blank ? measureGaps(span) : std::nullopt;
+    if (!gaps) {
+        return;
+    }
+    const float advance = span.font.getAdvance(*blank) * span.size;
+    const float spacing = round(gaps->width - advance, 1000.0F);
+    gaps->width = advance + spacing;
+    const std::optional<float> start = findStart(*gaps, spacing);
+    if (!start || !isShorter(*gaps, spacing)) {
+        return;
+    }
+    line.wordSpacing = spacing;
+    line.x.front() = *start;
+    span.font.findVariant(u" ", *blank, line.variant);
+    Line spaced;
+    for (std::size_t i = 0; i < line.clusters.size(); ++i) {
+        for (int count = gaps->blanks[i]; count > 0; --count) {
+            spaced.text.append(u' ');
+            spaced.glyphs.push_back({1, static_cast<std::uint16_t>(*blank)});
+        }
+        const std::u16string& text = line.clusters[i]->text;
+        spaced.text.append(text.data(), static_cast<std::int32_t>(text.size()));
+        spaced.glyphs.push_back(line.glyphs[i]);
+    }
+    line.text = spaced.text;
+    line.glyphs = std::move(spaced.glyphs);
+    line.placed = 1;
+}
+
+/// Returns: how many blanks of what width stand between the glyphs, or nothing.
+std::optional<TextWriter::Gaps> TextWriter::measureGaps(const TextSpan& span) const {
+    constexpr float minGap = 0.15F; // of the size of the font
+    constexpr int maxBlanks = 40;
+    std::vector<float> widths(line.clusters.size());
+    float least = 0;
+    float sum = 0;
+    for (std::size_t i = 1; i < widths.size(); ++i) {
+        const TextSpan::Cluster& before = *line.clusters[i - 1];
+        const float gap = line.clusters[i]->at.x - before.at.x - before.advance;
+        if (gap > minGap * span.size) {
+            widths[i] = gap;
+            least = least > 0 ? std::min(least, gap) : gap;
+            sum += gap;
+        } else if (std::abs(gap) > closeEnough ||
+                   !span.font.joinLetters(line.variant, before.text.back(),
+                                          line.clusters[i]->text.front())) {
+            return std::nullopt;
+        }
+    }
+    Gaps gaps;
+    int count = 0;
+    for (const float width : widths) {
+        gaps.blanks.push_back(least > 0 ? static_cast<int>(std::lround(width / least)) : 0);
+        count += gaps.blanks.back();
+        if (gaps.blanks.back() > maxBlanks) {
+            return std::nullopt;
+        }
+    }
+    gaps.width = count > 0 ? sum / static_cast<float>(count) : 0;
+    return gaps;
+}
+
+/// Returns: the position of the first glyph that takes every glyph to where it belongs, or nothing.
+std::optional<float> TextWriter::findStart(const Gaps& gaps, float wordSpacing) const {
+    const float start = line.clusters.front()->at.x;
+    float next = start;
+    float least = 0;
+    float most = 0;
+    for (std::size_t i = 0; i < line.clusters.size(); ++i) {
+        const TextSpan::Cluster& cluster = *line.clusters[i];
+        next += static_cast<float>(gaps.blanks[i]) * gaps.width;
+        least = std::min(least, next - cluster.at.x);
+        most = std::max(most, next - cluster.at.x);
+        next += cluster.advance + (cluster.text == u" " ? wordSpacing : 0);
+    }
+    const float best = toHundredth(start - (least + most) / 2);
+    const bool isClose = start - best - least <= closeEnough && best - start + most <= closeEnough;
+    return isClose ? std::optional(best) : std::nullopt;
+}
+
+/// Returns: whether the blanks take less room than the positions.
+bool TextWriter::isShorter(const Gaps& gaps, float wordSpacing) const {
+    constexpr std::size_t positionLength = 7;
+    constexpr std::size_t attributeLength = 22;
+    const int blanks = std::accumulate(gaps.blanks.begin(), gaps.blanks.end(), 0);
+    return static_cast<std::size_t>(blanks) + (wordSpacing == 0 ? 0 : attributeLength) <
+           positionLength * (line.placed - 1);
+}
+
 void TextWriter::flushLine(const TextSpan& span, const TextPaint& paint) {
     if (line.text.isEmpty()) {
         return;
+    }
+    if (mode == TEXTMODE_FONTS && line.placed > 1 && !line.hasRightToLeft &&
+        canvas.getClipping() != CLIPPING_NONE) { // the lesser profiles have no word spacing
+        fillGaps(span);
     }
     std::vector<MoxLength> x;
     std::transform(line.x.begin(), line.x.begin() + static_cast<std::ptrdiff_t>(line.placed),
@@ -208,6 +317,7 @@ void TextWriter::flushLine(const TextSpan& span, const TextPaint& paint) {
     canvas.beginElement();
     setPaint(paint);
     canvas.out.setFont(&font, file);
+    canvas.out.setWordSpacing(pt(line.wordSpacing));
     TalFont::TLStringWithGlyphInfo glyphs(line.glyphs);
     canvas.out.drawText(line.text, x, {pt(line.y)}, {}, paint.mode, &glyphs, /*wholeRun=*/false,
                         /*leftToRight=*/true);
@@ -228,7 +338,7 @@ void TextWriter::setPaint(const TextPaint& paint) {
         settings.setNoStroke();
     }
     // The rule reaches the outlines of embedded fonts, and those of font files mean this one.
-    settings.setFillRule(mode == TEXTMODE_FONTS ? FILLRULE_NONZERO : FILLRULE_EVENODD);
+    settings.setFillRule(line.isFilledAlike ? FILLRULE_EVENODD : FILLRULE_NONZERO);
 }
 
 } // namespace DrawmereConvert

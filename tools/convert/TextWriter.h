@@ -9,6 +9,7 @@
 
 #include <mupdf/fitz.h>
 
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -66,18 +67,32 @@ private:
     /// The text element in the making.
     struct Line {
         UnicodeString text;
-        std::vector<float> x;   // one for each character
+        std::vector<const TextSpan::Cluster*> clusters; // borrowed from the span
+        std::vector<float> x;                           // one for each character
         std::size_t placed = 0; // how many need one; the others follow by themselves
         float next = 0;         // where a character is that follows by itself
-        bool endsRightToLeft = false;
+        float wordSpacing = 0;
         std::vector<TalFont::TLGlyphEntry> glyphs;
         float y = 0;
         int variant = 0;
-        bool isLigature = false;
+        bool hasLigature = false;
+        bool hasRightToLeft = false;
+        bool isFilledAlike = true; // by both rules
     };
 
+    /// Equal gaps between words.
+    struct Gaps {
+        std::vector<int> blanks; // before each cluster
+        float width = 0;         // of a blank
+    };
+
+    bool follows(const TextSpan::Cluster& cluster, int variant, TextFont& font) const;
     bool startsLine(const TextSpan::Cluster& cluster, int variant) const;
-    void add(const TextSpan::Cluster& cluster);
+    void add(const TextSpan::Cluster& cluster, bool isNext, TextFont& font);
+    void fillGaps(const TextSpan& span);
+    std::optional<Gaps> measureGaps(const TextSpan& span) const;
+    std::optional<float> findStart(const Gaps& gaps, float wordSpacing) const;
+    bool isShorter(const Gaps& gaps, float wordSpacing) const;
     void flushLine(const TextSpan& span, const TextPaint& paint);
     void setPaint(const TextPaint& paint);
 
