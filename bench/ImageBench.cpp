@@ -149,7 +149,7 @@ void drawImages(Drawmere& page, const ImageFiles& files) {
 void drawImages(CairoPeer& page, const ImageFiles& files) {
     for (std::size_t i = 0; i < imageCount; ++i) {
         const Place place(i);
-        page.drawPng(files.paths[i % files.paths.size()], place.x, place.y);
+        page.drawPng(files.paths[i % files.paths.size()], place.x, place.y, width, height);
     }
 }
 

@@ -1,7 +1,7 @@
 #include "bench/PlainWriter.h"
 
-#include <array>
-#include <charconv>
+#include "bench/PlainText.h"
+
 #include <cstring>
 
 #include <fcntl.h>
@@ -11,31 +11,7 @@ namespace DrawmereNS {
 namespace {
 
 constexpr std::size_t bufferSize = std::size_t{1} << 20U;
-constexpr std::size_t maxNumber = 64; // a float has 39 digits before the point
-constexpr int decimals = 3;
 constexpr std::size_t imageChunk = std::size_t{3} << 14U;
-
-char* dropTrailingZeros(char* end) {
-    while (end[-1] == '0') {
-        --end;
-    }
-    return end[-1] == '.' ? end - 1 : end;
-}
-
-using Pair = std::array<char, 2>;
-
-/// Returns: the two characters of base64 for each number of twelve bits.
-std::vector<Pair> makePairs() {
-    constexpr std::string_view alphabet =
-        "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
-    std::vector<Pair> pairs;
-    for (const char first : alphabet) {
-        for (const char second : alphabet) {
-            pairs.push_back({first, second});
-        }
-    }
-    return pairs;
-}
 
 } // namespace
 
@@ -131,7 +107,7 @@ void PlainWriter::curveTo(float x1, float y1, float x2, float y2, float x3, floa
 }
 
 void PlainWriter::endPath() {
-    append("\"");
+    endPathData();
     addPaint({.fill = false, .stroke = true});
     endEmptyElement();
 }
@@ -160,35 +136,22 @@ void PlainWriter::drawImage(const std::string& imagePath, float x, float y, floa
     addNumber("y", y + state.shiftY);
     addNumber("width", width);
     addNumber("height", height);
-    startAttribute("href");
-    append("data:image/png;base64,");
+    addImageData("href", imagePath);
+    endEmptyElement();
+}
+
+void PlainWriter::addImageData(std::string_view name, const std::string& imagePath) {
+    startAttribute(name);
+    append(plainImagePrefix);
     const int source = open(imagePath.c_str(), O_RDONLY | O_CLOEXEC);
     const std::unique_ptr<unsigned char[]> bytes(new unsigned char[imageChunk]);
     ssize_t count = 0;
     while ((count = read(source, bytes.get(), imageChunk)) > 0) {
-        appendBase64(bytes.get(), static_cast<std::size_t>(count));
+        const auto size = static_cast<std::size_t>(count);
+        cursor = printPlainBase64(room(size / 3 * 4 + 4), bytes.get(), size);
     }
     failed = close(source) != 0 || count < 0 || failed;
     append("\"");
-    endEmptyElement();
-}
-
-/// Two characters at a time by a table. All chunks but the last are whole triples.
-void PlainWriter::appendBase64(const unsigned char* bytes, std::size_t count) {
-    static const std::vector<Pair> pairs = makePairs();
-    char* out = room(count / 3 * 4 + 4);
-    for (; count >= 3; count -= 3, bytes += 3, out += 4) {
-        std::memcpy(out, &pairs[bytes[0] << 4U | bytes[1] >> 4U], 2);
-        std::memcpy(out + 2, &pairs[(bytes[1] & 0xFU) << 8U | bytes[2]], 2);
-    }
-    if (count > 0) {
-        const unsigned int second = count > 1 ? bytes[1] : 0U;
-        std::memcpy(out, &pairs[bytes[0] << 4U | second >> 4U], 2);
-        out[2] = count > 1 ? pairs[(second & 0xFU) << 8U][0] : '=';
-        out[3] = '=';
-        out += 4;
-    }
-    cursor = out;
 }
 
 void PlainWriter::startElement(std::string_view name) {
@@ -203,18 +166,22 @@ void PlainWriter::addNumber(std::string_view name, float value) {
 }
 
 void PlainWriter::addColor(std::string_view name, std::uint32_t rgb) {
-    constexpr std::string_view digits = "0123456789abcdef";
-    char text[] = "#rrggbb";
-    for (int i = 6; i > 0; --i) {
-        text[i] = digits[rgb & 0xFU];
-        rgb >>= 4U;
-    }
-    addText(name, text);
+    addText(name, makePlainColor(rgb).data());
 }
 
 void PlainWriter::addText(std::string_view name, std::string_view value) {
     startAttribute(name);
     append(value);
+    append("\"");
+}
+
+void PlainWriter::addMatrix(std::string_view name, const Matrix& matrix) {
+    startAttribute(name);
+    append("matrix(");
+    for (const float& number : matrix) {
+        appendNumber(number);
+        append(&number == &matrix.back() ? ")" : ",");
+    }
     append("\"");
 }
 
@@ -228,18 +195,6 @@ void PlainWriter::endElement(std::string_view name) {
     append("</");
     append(name);
     append(">");
-}
-
-void PlainWriter::startGroup(const Matrix& matrix) {
-    startElement("g");
-    startAttribute("transform");
-    append("matrix(");
-    const float numbers[] = {matrix.a, matrix.b, matrix.c, matrix.d, matrix.e, matrix.f};
-    for (const float& number : numbers) {
-        appendNumber(number);
-        append(&number == &numbers[5] ? ")" : ",");
-    }
-    append("\">");
 }
 
 void PlainWriter::addPaint(Paint paint) {
@@ -266,10 +221,7 @@ void PlainWriter::append(std::string_view bytes) {
 }
 
 void PlainWriter::appendNumber(float value) {
-    char* begin = room(maxNumber);
-    const auto end =
-        std::to_chars(begin, begin + maxNumber, value, std::chars_format::fixed, decimals).ptr;
-    cursor = dropTrailingZeros(end);
+    cursor = printPlainNumber(room(maxPlainNumber), value);
 }
 
 void PlainWriter::appendPoint(float x, float y) {

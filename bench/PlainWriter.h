@@ -1,6 +1,7 @@
 /// The yardstick of the benches: SVG written straight into a buffer, without a tree.
 #pragma once
 
+#include <array>
 #include <cstdint>
 #include <memory>
 #include <span>
@@ -22,14 +23,7 @@ public:
     };
 
     /// The six numbers of a matrix as SVG 1.1 orders them.
-    struct Matrix {
-        float a;
-        float b;
-        float c;
-        float d;
-        float e;
-        float f;
-    };
+    using Matrix = std::array<float, 6>;
 
     /// Makes the file `path` and begins a document.
     explicit PlainWriter(const std::string& path);
@@ -67,6 +61,9 @@ public:
     void curveTo(float x1, float y1, float x2, float y2, float x3, float y3);
     void endPath();
 
+    /// Ends only the data of the path; its other attributes follow.
+    void endPathData() { append("\""); }
+
     void setFont(std::string_view family, float size) {
         fontFamily = family;
         fontSize = size;
@@ -83,6 +80,12 @@ public:
     void addNumber(std::string_view name, float value);
     void addColor(std::string_view name, std::uint32_t rgb);
     void addText(std::string_view name, std::string_view value);
+    void addMatrix(std::string_view name, const Matrix& matrix);
+    /// Adds the bytes of a PNG file in base64.
+    void addImageData(std::string_view name, const std::string& imagePath);
+
+    /// Adds text that needs no escapes to an element that is open.
+    void addContent(std::string_view text) { append(text); }
 
     void endEmptyElement() { append("/>"); }
 
@@ -95,10 +98,6 @@ public:
     void openElement() { append(">"); }
 
     void endElement(std::string_view name);
-
-    void startGroup(const Matrix& matrix);
-
-    void endGroup() { append("</g>"); }
 
 private:
     struct State {
@@ -114,7 +113,6 @@ private:
     void appendPoint(float x, float y);
     void startAttribute(std::string_view name);
     void addPaint(Paint paint);
-    void appendBase64(const unsigned char* bytes, std::size_t count);
     char* room(std::size_t count);
     void flush();
 

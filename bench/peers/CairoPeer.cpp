@@ -18,6 +18,29 @@ void addStop(cairo_pattern_t* pattern, double offset, std::uint32_t rgb) {
                                      channel(rgb, 0));
 }
 
+/// Returns: the number that a PNG file has at this place.
+int readInt(const std::string& bytes, std::size_t place) {
+    int number = 0;
+    for (std::size_t i = 0; i < 4 && place + i < bytes.size(); ++i) {
+        number = number * 256 + static_cast<unsigned char>(bytes[place + i]);
+    }
+    return number;
+}
+
+/// Returns: an image with the bytes of the file, and pixels that nobody looks at.
+cairo_surface_t* openPng(const std::string& path) {
+    constexpr std::size_t widthPlace = 16;
+    constexpr std::size_t heightPlace = 20;
+    std::ifstream file(path, std::ios::binary);
+    auto* const bytes = new std::string(std::istreambuf_iterator<char>(file), {});
+    cairo_surface_t* const image = cairo_image_surface_create(
+        CAIRO_FORMAT_RGB24, readInt(*bytes, widthPlace), readInt(*bytes, heightPlace));
+    cairo_surface_set_mime_data(
+        image, CAIRO_MIME_TYPE_PNG, reinterpret_cast<const unsigned char*>(bytes->data()),
+        bytes->size(), [](void* owned) { delete static_cast<std::string*>(owned); }, bytes);
+    return image;
+}
+
 } // namespace
 
 CairoPeer::CairoPeer(const std::string& path, float width, float height)
@@ -25,6 +48,9 @@ CairoPeer::CairoPeer(const std::string& path, float width, float height)
       context(cairo_create(surface)) {}
 
 CairoPeer::~CairoPeer() {
+    for (const auto& [path, image] : images) {
+        cairo_surface_destroy(image);
+    }
     cairo_glyph_free(glyphs);
     cairo_destroy(context);
     cairo_surface_destroy(surface);
@@ -32,7 +58,15 @@ CairoPeer::~CairoPeer() {
 
 void CairoPeer::translate(float x, float y) { cairo_translate(context, wide(x), wide(y)); }
 
+void CairoPeer::transform(const std::array<float, 6>& matrix) {
+    const cairo_matrix_t wideMatrix = {wide(matrix[0]), wide(matrix[1]), wide(matrix[2]),
+                                       wide(matrix[3]), wide(matrix[4]), wide(matrix[5])};
+    cairo_transform(context, &wideMatrix);
+}
+
 void CairoPeer::setStrokeWidth(float width) { cairo_set_line_width(context, wide(width)); }
+
+void CairoPeer::setMiterLimit(int limit) { cairo_set_miter_limit(context, limit); }
 
 void CairoPeer::strokeRect(float x, float y, float width, float height) {
     addRect(x, y, width, height);
@@ -98,16 +132,18 @@ void CairoPeer::drawText(const char* text, const float* x, float y) {
     cairo_show_glyphs(context, glyphs, glyphCount);
 }
 
-void CairoPeer::drawPng(const std::string& imagePath, float x, float y) {
-    std::ifstream file(imagePath, std::ios::binary);
-    auto* const bytes = new std::string(std::istreambuf_iterator<char>(file), {});
-    cairo_surface_t* const image = cairo_image_surface_create(CAIRO_FORMAT_RGB24, 1, 1);
-    cairo_surface_set_mime_data(
-        image, CAIRO_MIME_TYPE_PNG, reinterpret_cast<const unsigned char*>(bytes->data()),
-        bytes->size(), [](void* owned) { delete static_cast<std::string*>(owned); }, bytes);
-    cairo_set_source_surface(context, image, wide(x), wide(y));
+void CairoPeer::drawPng(const std::string& imagePath, float x, float y, float width, float height) {
+    cairo_surface_t*& image = images[imagePath];
+    if (!image) {
+        image = openPng(imagePath);
+    }
+    cairo_save(context);
+    cairo_translate(context, wide(x), wide(y));
+    cairo_scale(context, wide(width) / cairo_image_surface_get_width(image),
+                wide(height) / cairo_image_surface_get_height(image));
+    cairo_set_source_surface(context, image, 0.0, 0.0);
     cairo_paint(context);
-    cairo_surface_destroy(image);
+    cairo_restore(context);
 }
 
 bool CairoPeer::finish() {

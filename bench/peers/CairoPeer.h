@@ -1,7 +1,9 @@
 /// The work of the benches done by cairo's SVG surface.
 #pragma once
 
+#include <array>
 #include <cstdint>
+#include <map>
 #include <string>
 
 #include <cairo.h>
@@ -22,12 +24,15 @@ public:
     void restore() { cairo_restore(context); }
 
     void translate(float x, float y);
+    /// Multiplies the coordinate system by a matrix of six numbers as SVG 1.1 orders them.
+    void transform(const std::array<float, 6>& matrix);
 
     void setFillColor(std::uint32_t rgb) { fillColor = rgb; }
 
     void setStrokeColor(std::uint32_t rgb) { strokeColor = rgb; }
 
     void setStrokeWidth(float width);
+    void setMiterLimit(int limit);
 
     void strokeRect(float x, float y, float width, float height);
     void fillAndStrokeRect(float x, float y, float width, float height);
@@ -54,8 +59,9 @@ public:
     /// Draws `text` with one x for each glyph. Shape: `x` has as many numbers as `text` glyphs.
     void drawText(const char* text, const float* x, float y);
 
-    /// Places the bytes of a PNG file, as they are, instead of pixels.
-    void drawPng(const std::string& imagePath, float x, float y);
+    /// Places the bytes of a PNG file, as they are, instead of pixels. The same file again is the
+    /// same image.
+    void drawPng(const std::string& imagePath, float x, float y, float width, float height);
 
     /// Ends the document. Returns: whether all went well.
     bool finish();
@@ -68,6 +74,7 @@ private:
     cairo_t* context;                // owned
     cairo_glyph_t* glyphs = nullptr; // owned
     int glyphCount = 0;
+    std::map<std::string, cairo_surface_t*> images; // owned
     std::uint32_t fillColor = 0;
     std::uint32_t strokeColor = 0;
 };
