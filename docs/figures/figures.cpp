@@ -122,7 +122,7 @@ constexpr float gap = 12;
 void drawFolder(Drawmere& page, const Folder& folder, const Area& area, const MoxColor& color) {
     const bool hasMore = folder.more[0] != u'\0';
     drawBox(page, area, color);
-    const float y = area.y + (hasMore ? 20 : 26);
+    const float y = area.y + (hasMore ? 20.0F : 26.0F);
     drawText(page, name, folder.name, area.middle(), y, TEXTANCHOR_MIDDLE);
     drawText(page, note, folder.note, area.middle(), y + 16, TEXTANCHOR_MIDDLE);
     if (hasMore) {
@@ -181,7 +181,7 @@ const std::vector<Time>& getTimes() {
           {u"SVGFullImpl::addElement", u"the profile may drop it; content goes to the group"},
           {u"SVGGroupManager::addElement", u"appends it to the open group, or opens one"},
           {u"SVGGraphicContext::AttrValueCompare", u"writes on it what differs from the group"}},
-         u"<g> <rect x=\"20\" y=\"20\" width=\"60\" height=\"40\" fill=\"red\"/> </g>, outside the tree",
+         u"<g> <rect x=\"20\" y=\"20\" width=\"60\" ... fill=\"red\"/> </g>, outside the tree",
          seaTint},
         {u"2. When the group closes: another kind, push, pop, a path, the end",
          {{u"SVGGroupManager::appendToTree", u"hands the group over and moves the state outwards"},
