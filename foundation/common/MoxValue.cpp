@@ -58,6 +58,9 @@ template <typename Unit> bool isAscii(std::basic_string_view<Unit> text) {
 UnicodeString fromBytes(const char* text, std::size_t length) {
     UnicodeString result(static_cast<std::int32_t>(length), 0, 0);
     char16_t* units = result.getBuffer(static_cast<std::int32_t>(length));
+    if (!units) {
+        throw std::bad_alloc();
+    }
     std::transform(text, text + length, units,
                    [](char c) { return static_cast<char16_t>(static_cast<unsigned char>(c)); });
     result.releaseBuffer(static_cast<std::int32_t>(length));

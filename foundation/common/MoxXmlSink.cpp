@@ -4,16 +4,26 @@
 #include "foundation/common/MoxNumberText.h"
 
 #include <algorithm>
+#include <new>
 #include <numeric>
 #include <ostream>
 #include <string>
+#include <utility>
 #include <unicode/ucnv.h>
 #include <unicode/ucnv_cb.h>
 #include <unicode/ucnv_err.h>
+#include <unicode/uniset.h>
 #include <unicode/uset.h>
 
 namespace MoxCommonNS {
 namespace {
+
+/// ICU tells of a lack of memory like of any other failure, but its results are worth nothing then.
+void requireMemory(UErrorCode status) {
+    if (status == U_MEMORY_ALLOCATION_ERROR) {
+        throw std::bad_alloc();
+    }
+}
 
 /// An encoding name as an XML declaration takes it (XML 1.0, production 81).
 bool isEncodingName(std::string_view name) {
@@ -92,6 +102,7 @@ void MoxXmlSink::openConverter(const UnicodeString& encoding) {
     encoding.toUTF8String(name);
     UErrorCode status = U_ZERO_ERROR;
     target.reset(ucnv_open(name.c_str(), &status));
+    requireMemory(status);
     if (U_FAILURE(status) || ucnv_getType(target.get()) == UCNV_UTF8 ||
         !carriesAscii(target.get())) {
         return;
@@ -102,6 +113,7 @@ void MoxXmlSink::openConverter(const UnicodeString& encoding) {
     if (declared) {
         encodingName = declared;
         source.reset(ucnv_open("UTF-8", &status));
+        requireMemory(status);
     }
 }
 
@@ -110,13 +122,22 @@ bool MoxXmlSink::canCarry(UChar32 codePoint) {
         return true;
     }
     if (!carried) {
-        UErrorCode status = U_ZERO_ERROR;
-        carried.reset(uset_openEmpty());
-        ucnv_getUnicodeSet(target.get(), carried.get(), UCNV_ROUNDTRIP_SET, &status);
-        // Some encodings can't tell what they have.
-        uset_addRange(carried.get(), ' ', '~');
+        readCarried();
     }
     return uset_contains(carried.get(), codePoint) != 0;
+}
+
+void MoxXmlSink::readCarried() {
+    std::unique_ptr<USet, SetDeleter> set(uset_openEmpty());
+    UErrorCode status = set ? U_ZERO_ERROR : U_MEMORY_ALLOCATION_ERROR;
+    ucnv_getUnicodeSet(target.get(), set.get(), UCNV_ROUNDTRIP_SET, &status);
+    requireMemory(status);
+    // Some encodings can't tell what they have.
+    uset_addRange(set.get(), ' ', '~');
+    if (icu::UnicodeSet::fromUSet(set.get())->isBogus()) {
+        throw std::bad_alloc();
+    }
+    carried = std::move(set);
 }
 
 void MoxXmlSink::finish() {
@@ -155,6 +176,7 @@ void MoxXmlSink::convert(const char* bytes, std::size_t count, bool isLast) {
         ucnv_convertEx(target.get(), source.get(), &out, std::end(converted), &bytes, end, pivot,
                        &pivotSource, &pivotTarget, std::end(pivot), /*reset=*/false,
                        static_cast<UBool>(isLast), &status);
+        requireMemory(status);
         stream.write(converted, out - converted);
     }
 }

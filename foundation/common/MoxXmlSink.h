@@ -74,6 +74,7 @@ private:
         void operator()(USet* set) const;
     };
 
+    void readCarried();
     void openConverter(const UnicodeString& encoding);
     void writeLong(std::string_view bytes);
     void flushBuffer();

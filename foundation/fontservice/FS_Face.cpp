@@ -9,6 +9,7 @@
 #include <hb-ot.h>
 
 #include <algorithm>
+#include <new>
 #include <span>
 #include <utility>
 
@@ -50,12 +51,15 @@ struct MetricField {
 
 std::shared_ptr<FS_Face> FS_Face::open(const FS_FaceRequest& request) {
     const std::shared_ptr<FS_FontLibrary> library = FS_FontLibrary::shared();
-    FT_Face opened = library ? library->open(request.source, request.faceIndex) : nullptr;
+    const auto close = [&library](FT_Face face) { library->close(face); };
+    std::unique_ptr<FT_FaceRec, decltype(close)> opened(
+        library->open(request.source, request.faceIndex), close);
     if (!opened) {
         return nullptr;
     }
-    const std::shared_ptr<FS_Face> made(new FS_Face(library, request.source, opened));
-    return made->setUp(request) ? made : nullptr;
+    std::unique_ptr<FS_Face> made(new FS_Face(library, request.source, opened.get()));
+    static_cast<void>(opened.release());
+    return made->setUp(request) ? std::shared_ptr<FS_Face>(std::move(made)) : nullptr;
 }
 
 FS_Face::FS_Face(std::shared_ptr<FS_FontLibrary> fontLibrary, FS_FontSource fontSource,
@@ -71,6 +75,9 @@ FS_Face::~FS_Face() {
 }
 
 bool FS_Face::setUp(const FS_FaceRequest& request) {
+    if (shapes == hb_face_get_empty()) {
+        throw std::bad_alloc(); // this is how HarfBuzz says it
+    }
     if (FT_IS_SCALABLE(face) && face->units_per_EM > 0) {
         unitsPerEm = face->units_per_EM;
     }
@@ -79,6 +86,7 @@ bool FS_Face::setUp(const FS_FaceRequest& request) {
     FS_VariationAxes axes(face);
     const int designedWidth = style.widthClass;
     if (request.axes && !axes.apply(*request.axes)) {
+        FS_FontLibrary::requireMemory();
         return false;
     }
     axes.readStyle(style);
@@ -89,6 +97,7 @@ bool FS_Face::setUp(const FS_FaceRequest& request) {
         familyName += u' ';
         familyName += widthWordOf(style.widthClass);
     }
+    FS_FontLibrary::requireMemory();
     return true;
 }
 
@@ -112,6 +121,9 @@ void FS_Face::chooseCharMap() {
     const auto isSymbols = [](FT_CharMap map) { return map->encoding == FT_ENCODING_MS_SYMBOL; };
     if (std::ranges::any_of(maps, isSymbols)) {
         symbols = hb_font_create(shapes);
+        if (symbols == hb_font_get_empty()) {
+            throw std::bad_alloc();
+        }
         hb_ot_font_set_funcs(symbols);
     }
     if (!face->charmap && !maps.empty()) {
@@ -160,7 +172,13 @@ bool FS_Face::readGlyph(unsigned glyphId, FS_GlyphDrawInfo& info) {
 
 bool FS_Face::loadOutline(unsigned glyphId, FS_GlyphDrawInfo& info) {
     if (!FT_IS_SCALABLE(face) || glyphId >= static_cast<unsigned long>(face->num_glyphs) ||
-        !composites.isBounded(glyphId) || FT_Load_Glyph(face, glyphId, FT_LOAD_NO_SCALE) != 0) {
+        !composites.isBounded(glyphId)) {
+        return false;
+    }
+    FS_FontLibrary::expectMemory();
+    const bool isLoaded = FT_Load_Glyph(face, glyphId, FT_LOAD_NO_SCALE) == 0;
+    FS_FontLibrary::requireMemory();
+    if (!isLoaded) {
         return false;
     }
     const FT_GlyphSlot slot = face->glyph;
@@ -199,7 +217,10 @@ void FS_Face::readMetrics(FS_NewTextMetricEx& metrics, int unitsWanted) {
 
 std::vector<UnicodeString> FS_Face::readAllNames() {
     const std::lock_guard lock(inUse);
-    return readNames(face);
+    FS_FontLibrary::expectMemory();
+    std::vector<UnicodeString> names = readNames(face);
+    FS_FontLibrary::requireMemory();
+    return names;
 }
 
 } // namespace MoxFontService_NS

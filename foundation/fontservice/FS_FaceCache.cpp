@@ -43,6 +43,11 @@ std::shared_ptr<FS_Face> FS_FaceCache::find(const FS_FaceRequest& request) {
     return opened;
 }
 
+void FS_FaceCache::clear() {
+    const std::lock_guard lock(inUse);
+    faces.clear();
+}
+
 std::size_t FS_FaceCache::size() {
     const std::lock_guard lock(inUse);
     return faces.size();

@@ -23,6 +23,9 @@ public:
     /// Returns: the face, opened if need be; null for what can't be read.
     std::shared_ptr<FS_Face> find(const FS_FaceRequest& request);
 
+    /// Forgets all faces; those in use stay open.
+    void clear();
+
     /// Returns: the count of faces kept.
     std::size_t size();
 

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <memory>
+#include <new>
 #include <strings.h>
 #include <tuple>
 #include <utility>
@@ -136,15 +137,34 @@ FS_FoundName makeFound(const Candidate& font, const FS_FaceStyle& wanted) {
     return found;
 }
 
+// fontconfig has no other reason to fail where this is asked.
+void requireMemory(bool isThere) {
+    if (!isThere) {
+        throw std::bad_alloc();
+    }
+}
+
+PatternPtr makePattern() {
+    PatternPtr pattern(FcPatternCreate());
+    requireMemory(pattern != nullptr);
+    return pattern;
+}
+
+void add(FcPattern& pattern, const char* property, const std::string& text) {
+    requireMemory(FcPatternAddString(&pattern, property, toFc(text)) != FcFalse);
+}
+
 std::vector<Candidate> listFonts(FcConfig* config, const char* property, const std::string& name) {
-    const PatternPtr pattern(FcPatternCreate());
-    FcPatternAddString(pattern.get(), property, toFc(name));
+    const PatternPtr pattern = makePattern();
+    add(*pattern, property, name);
     const ObjectSetPtr wanted(FcObjectSetBuild(FC_FILE, FC_INDEX, FC_WEIGHT, FC_SLANT, FC_WIDTH,
                                                FC_VARIABLE, FC_OUTLINE, FC_FONTVERSION, FC_FULLNAME,
                                                nullptr));
+    requireMemory(wanted != nullptr);
     const FontSetPtr listed(FcFontList(config, pattern.get(), wanted.get()));
     std::vector<Candidate> fonts;
-    for (int i = 0; listed && i < listed->nfont; ++i) {
+    requireMemory(listed != nullptr);
+    for (int i = 0; i < listed->nfont; ++i) {
         fonts.push_back(readCandidate(listed->fonts[i]));
     }
     return fonts;
@@ -168,17 +188,16 @@ void takeAway(std::vector<std::string>& families, const std::vector<std::string>
 
 } // namespace
 
-FS_FontConfig::FS_FontConfig() : config(FcInitLoadConfigAndFonts()) {}
-
-FS_FontConfig::~FS_FontConfig() {
-    if (config) {
-        FcConfigDestroy(config);
-    }
+// A configuration that can't be read is replaced by one that knows no fonts.
+FS_FontConfig::FS_FontConfig() : config(FcInitLoadConfigAndFonts()) {
+    requireMemory(config != nullptr);
 }
+
+FS_FontConfig::~FS_FontConfig() { FcConfigDestroy(config); }
 
 std::optional<FS_FoundName> FS_FontConfig::find(const std::string& name,
                                                 const FS_FaceStyle& wanted) const {
-    if (!config || name.empty()) {
+    if (name.empty()) {
         return std::nullopt;
     }
     for (const char* property : {FC_FAMILY, FC_FULLNAME, FC_POSTSCRIPT_NAME}) {
@@ -189,11 +208,11 @@ std::optional<FS_FoundName> FS_FontConfig::find(const std::string& name,
     return isGeneric(name) ? findGeneric(name, wanted) : findAlias(name, wanted);
 }
 
-bool FS_FontConfig::isUpToDate() const { return !config || FcConfigUptoDate(config) == FcTrue; }
+bool FS_FontConfig::isUpToDate() const { return FcConfigUptoDate(config) == FcTrue; }
 
 std::chrono::seconds FS_FontConfig::getRescanInterval() const {
     constexpr std::chrono::hours never{24 * 365};
-    const int seconds = config ? FcConfigGetRescanInterval(config) : 0;
+    const int seconds = FcConfigGetRescanInterval(config);
     return seconds > 0 ? std::chrono::seconds(seconds) : never;
 }
 
@@ -232,9 +251,9 @@ std::optional<FS_FoundName> FS_FontConfig::findAlias(const std::string& name,
 // Whatever fontconfig takes for a generic family is right.
 std::optional<FS_FoundName> FS_FontConfig::findGeneric(const std::string& name,
                                                        const FS_FaceStyle& wanted) const {
-    const PatternPtr pattern(FcPatternCreate());
-    FcPatternAddString(pattern.get(), FC_FAMILY, toFc(name));
-    FcConfigSubstitute(config, pattern.get(), FcMatchPattern);
+    const PatternPtr pattern = makePattern();
+    add(*pattern, FC_FAMILY, name);
+    requireMemory(FcConfigSubstitute(config, pattern.get(), FcMatchPattern) != FcFalse);
     FcDefaultSubstitute(pattern.get());
     FcResult result = FcResultNoMatch;
     const PatternPtr match(FcFontMatch(config, pattern.get(), &result));
@@ -245,11 +264,11 @@ std::optional<FS_FoundName> FS_FontConfig::findGeneric(const std::string& name,
 }
 
 FS_FontConfig::Families FS_FontConfig::substitute(const Families& families) const {
-    const PatternPtr pattern(FcPatternCreate());
+    const PatternPtr pattern = makePattern();
     for (const std::string& family : families) {
-        FcPatternAddString(pattern.get(), FC_FAMILY, toFc(family));
+        add(*pattern, FC_FAMILY, family);
     }
-    FcConfigSubstitute(config, pattern.get(), FcMatchPattern);
+    requireMemory(FcConfigSubstitute(config, pattern.get(), FcMatchPattern) != FcFalse);
     Families made;
     FcChar8* family = nullptr;
     while (FcPatternGetString(pattern.get(), FC_FAMILY, static_cast<int>(made.size()), &family) ==

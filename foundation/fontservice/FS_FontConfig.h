@@ -16,7 +16,7 @@ namespace MoxFontService_NS {
 /// share and change. One thread at a time.
 class FS_FontConfig {
 public:
-    /// Reads the configuration and the list of fonts.
+    /// Reads the configuration and the list of fonts. Throws: std::bad_alloc.
     FS_FontConfig();
     FS_FontConfig(const FS_FontConfig&) = delete;
     FS_FontConfig& operator=(const FS_FontConfig&) = delete;
@@ -44,7 +44,7 @@ private:
     Families substitute(const Families& families) const;
     Families findDeclared(const std::string& name) const;
 
-    FcConfig* config; // owned; null when there is none to be had
+    FcConfig* config; // owned
 };
 
 } // namespace MoxFontService_NS

@@ -1,8 +1,12 @@
 #include "foundation/fontservice/FS_FontLibrary.h"
 
 #include <algorithm>
+#include <cstdlib>
 #include <fstream>
+#include <new>
 #include <string_view>
+
+#include FT_MODULE_H
 
 namespace MoxFontService_NS {
 
@@ -37,27 +41,58 @@ bool unpacksTooFar(const std::string& head) {
     return size > mostUnpackedBytes;
 }
 
+// FreeType has many names for a failure that comes of a lack of memory, and goes on where it can.
+thread_local bool hasLackedMemory = false;
+
+void* noted(void* block) {
+    hasLackedMemory = hasLackedMemory || !block;
+    return block;
+}
+
+void* allocate(FT_Memory /*memory*/, long size) { return noted(std::malloc(size)); }
+
+void* reallocate(FT_Memory /*memory*/, long /*oldSize*/, long size, void* block) {
+    return noted(std::realloc(block, size));
+}
+
+void release(FT_Memory /*memory*/, void* block) { std::free(block); }
+
 } // namespace
 
 std::shared_ptr<FS_FontLibrary> FS_FontLibrary::shared() {
-    static const std::shared_ptr<FS_FontLibrary> instance = [] {
-        auto made = std::make_shared<FS_FontLibrary>();
-        return FT_Init_FreeType(&made->library) == 0 ? made : nullptr;
-    }();
+    static const auto instance = std::make_shared<FS_FontLibrary>();
     return instance;
 }
 
-FS_FontLibrary::~FS_FontLibrary() {
-    if (library) {
-        FT_Done_FreeType(library);
+FS_FontLibrary::FS_FontLibrary() : memory{nullptr, allocate, release, reallocate} {
+    expectMemory();
+    if (FT_New_Library(&memory, &library) != 0) {
+        throw std::bad_alloc(); // nothing else can fail; the next call tries again
+    }
+    FT_Add_Default_Modules(library);
+    FT_Set_Default_Properties(library);
+    if (hasLackedMemory) {
+        FT_Done_Library(library);
+        throw std::bad_alloc();
     }
 }
+
+FS_FontLibrary::~FS_FontLibrary() { FT_Done_Library(library); }
+
+void FS_FontLibrary::requireMemory() {
+    if (hasLackedMemory) {
+        throw std::bad_alloc();
+    }
+}
+
+void FS_FontLibrary::expectMemory() { hasLackedMemory = false; }
 
 FT_Face FS_FontLibrary::open(const FS_FontSource& source, int faceIndex) {
     if (unpacksTooFar(readHead(source))) {
         return nullptr;
     }
     const std::lock_guard lock(inUse);
+    expectMemory();
     FT_Face face = nullptr;
     FT_Error error = 0;
     if (source.bytes) {
@@ -67,6 +102,10 @@ FT_Face FS_FontLibrary::open(const FS_FontSource& source, int faceIndex) {
     } else {
         error = FT_New_Face(library, source.path.c_str(), faceIndex, &face);
     }
+    if (hasLackedMemory && error == 0) {
+        FT_Done_Face(face); // it may lack something
+    }
+    requireMemory();
     return error == 0 ? face : nullptr;
 }
 

@@ -29,8 +29,10 @@ public:
 
     /// Keeps `value` under `key`, which has none yet, and forgets old values beyond the bounds.
     void insert(const std::string& key, Value value, std::size_t cost) {
-        items.push_front({key, std::move(value), cost});
-        places.emplace(key, items.begin());
+        std::list<Item> made;
+        made.push_front({key, std::move(value), cost});
+        places.emplace(key, made.begin());
+        items.splice(items.begin(), made);
         sumOfCosts += cost;
         while (items.size() > 1 && (items.size() > mostValues || sumOfCosts > mostCost)) {
             forgetOldest();

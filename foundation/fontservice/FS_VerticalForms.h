@@ -12,16 +12,12 @@ class FS_VerticalForms {
 public:
     /// Borrows: `fontFace`, for its life.
     explicit FS_VerticalForms(hb_face_t* fontFace);
-    FS_VerticalForms(const FS_VerticalForms&) = delete;
-    FS_VerticalForms& operator=(const FS_VerticalForms&) = delete;
-    ~FS_VerticalForms();
 
     /// Returns: the vertical form of the glyph, else the glyph itself.
     unsigned find(unsigned glyphId) const;
 
 private:
-    hb_face_t* face;  // borrowed
-    hb_set_t* glyphs; // owned, the scratch of `find`
+    hb_face_t* face; // borrowed
     std::vector<unsigned> lookups;
 };
 
