@@ -61,8 +61,13 @@ std::ostream* SVGConfig::createOStream(const UnicodeString& name) {
     if (!stream) {
         return nullptr;
     }
-    streamsByName.emplace(name, stream.get());
-    namesByStream.emplace(stream.get(), name);
+    const auto entry = namesByStream.emplace(stream.get(), name).first;
+    try {
+        streamsByName.emplace(name, stream.get());
+    } catch (...) { // no memory: a stream is in both books or in none
+        namesByStream.erase(entry);
+        throw;
+    }
     return stream.release();
 }
 

@@ -11,6 +11,8 @@
 #include "tree/SVGTreeManager.h"
 #include "tree/SVGUtil.h"
 
+#include <memory>
+
 namespace DrawmereNS {
 namespace {
 
@@ -57,12 +59,15 @@ MoxElement* findCommentSuccessor(const MoxElement& root) {
 } // namespace
 
 DrawmereImpl::DrawmereImpl(SVGConfig* options) : config(options) {
-    treeManager = new SVGTreeManager;
-    groupManager = new SVGGManager(config);
-    refIdManager = new SVGRefIDManager;
-    groupManager->treeManager = treeManager;
-    treeManager->context = groupManager->getGContext(); // for a clip ahead of any saved state
-    fontManager = new SVGFontManager(treeManager);
+    auto tree = std::make_unique<SVGTreeManager>();
+    auto groups = std::make_unique<SVGGManager>(config);
+    auto ids = std::make_unique<SVGRefIDManager>();
+    groups->treeManager = tree.get();
+    tree->context = groups->getGContext(); // for a clip ahead of any saved state
+    fontManager = new SVGFontManager(tree.get());
+    treeManager = tree.release();
+    groupManager = groups.release();
+    refIdManager = ids.release();
 }
 
 DrawmereImpl::~DrawmereImpl() {

@@ -109,7 +109,12 @@ void Drawmere::initRootSvg(std::ostream* stream) {
 void Drawmere::openImpl() {
     closeImpl();
     impl = createImplInstance(config->svgType);
-    impl->initRootSvg();
+    try {
+        impl->initRootSvg();
+    } catch (...) { // no memory
+        closeImpl();
+        throw;
+    }
 }
 
 void Drawmere::closeImpl() {
@@ -208,8 +213,14 @@ void Drawmere::writeFile(MoxDocument* document, const UnicodeString& path) {
     if (!stream) {
         DrawmereError::throwError(16414, path);
     }
-    saveDocument(document, stream);
-    const bool written = stream->flush().good();
+    bool written = false;
+    try {
+        saveDocument(document, stream);
+        written = stream->flush().good();
+    } catch (...) { // no memory
+        config->releaseOStream();
+        throw;
+    }
     config->releaseOStream();
     if (!written) {
         DrawmereError::throwError(16414, path);

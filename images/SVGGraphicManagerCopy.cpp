@@ -136,10 +136,11 @@ void SVGGraphicManager::writeCopy(TLGraphicImage* image, const UnicodeString& pa
         return;
     }
     stream->write(bytes->data.get(), static_cast<std::streamsize>(bytes->size));
-    if (!stream->flush()) {
+    const bool isWritten = stream->flush().good();
+    config->releaseOStream(stream);
+    if (!isWritten) {
         report(copyError, path);
     }
-    config->releaseOStream(stream);
 }
 
 UnicodeString SVGGraphicManager::convertImage(TLGraphicImage* image, const MoxUri& target) const {

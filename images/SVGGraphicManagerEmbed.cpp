@@ -39,6 +39,13 @@ constexpr std::string_view uriTypes[] = {"png;", "jpeg;"};
 
 constexpr std::size_t prefixRoom = uriStart.size() + uriTypes[1].size() + uriEnd.size();
 
+/// Tells of what the encoder of texts could not have; what it can't read is an empty text.
+void requireMemory(int result) {
+    if (result == SVGBase64::NO_MEMORY) {
+        DrawmereError::throwError(encodingError);
+    }
+}
+
 std::string makePrefix(GS_GraphicType type) {
     const bool isListed = type >= GRAPHICTYPE_PNG && type <= GRAPHICTYPE_JPEG;
     std::string prefix(uriStart);
@@ -202,14 +209,14 @@ bool SVGGraphicManager::execDownsample(GS_RasterImage* raster, MoxLength width,
 
 char* SVGGraphicManager::base64Encoding(const char* path) {
     makeEncodedBlock(SVGBase64::CreateMatchingEncodingBuffer(path, BASE64INPUTTYPE_FILE));
-    SVGBase64::encodeFile2Buffer(path, encodedText, encodedSize);
+    requireMemory(SVGBase64::encodeFile2Buffer(path, encodedText, encodedSize));
     return encodedText;
 }
 
 char* SVGGraphicManager::base64Encoding(std::istream& source) {
     const std::streamoff length = std::max<std::streamoff>(0, SVGImageBytes::start(source));
     makeEncodedBlock(SVGBase64::CalculateRecquiredEncodeOutputBufferSize(length));
-    SVGBase64::encodeStream2Buffer(source, encodedText, encodedSize);
+    requireMemory(SVGBase64::encodeStream2Buffer(source, encodedText, encodedSize));
     return encodedText;
 }
 
