@@ -4,6 +4,7 @@
 include(GoogleTest)
 find_package(GTest REQUIRED)
 pkg_check_modules(CAIRO REQUIRED IMPORTED_TARGET cairo)
+pkg_check_modules(XML2 REQUIRED IMPORTED_TARGET libxml-2.0)
 
 # drawmere_add_test(<folder> <sources...>) makes `<folder>_test` and registers each of its tests as
 # "<folder>.<suite>.<test>". A folder without tests makes nothing.

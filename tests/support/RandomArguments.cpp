@@ -54,8 +54,8 @@ constexpr MoxCommonNS::MoxNameEnum linkKeys[] = {
 
 void RandomCalls::configure(SVGConfig& config) {
     config.saveOption = pick(saveOptions);
-    config.svgType = temper == TAME ? pick(profiles) : make<SVGConfig::SVGTYPE>();
-    config.svgVersion = temper == TAME ? u"1.1" : make<UnicodeString>();
+    config.svgType = temper != WILD ? pick(profiles) : make<SVGConfig::SVGTYPE>();
+    config.svgVersion = temper != WILD ? u"1.1" : make<UnicodeString>();
     config.wispMode = flag();
     config.colorFlag = flag();
     config.imageBaseUri = make<UnicodeString>();
@@ -73,7 +73,7 @@ void RandomCalls::configure(SVGConfig& config) {
 template <> bool RandomCalls::make<bool>() { return flag(); }
 
 template <> float RandomCalls::make<float>() {
-    if (temper == TAME || flag()) {
+    if (temper != WILD || flag()) {
         return static_cast<float>(below(2000)) / 10.0F - 50.0F;
     }
     return flag() ? pick(oddReals) : std::bit_cast<float>(number());
@@ -83,7 +83,7 @@ template <> UnicodeString RandomCalls::make<UnicodeString>() {
     if (!ids.empty() && below(4) == 0) {
         return ids[below(static_cast<unsigned>(ids.size()))];
     }
-    UnicodeString text = temper == TAME ? pick(tameTexts) : pick(oddTexts);
+    UnicodeString text = temper != WILD ? pick(tameTexts) : pick(oddTexts);
     if (temper == WILD) {
         for (unsigned more = flag() ? 0 : below(12); more > 0; --more) {
             text.append(static_cast<char16_t>(below(flag() ? 0x80 : 0x10000)));
@@ -136,7 +136,8 @@ template <> SVGFont RandomCalls::make<SVGFont>() {
     const UnicodeString name = make<UnicodeString>();
     const UnicodeString variant = make<UnicodeString>();
     const auto size = make<MoxLength>();
-    const auto weight = make<FONTWEIGHT>();
+    constexpr FONTWEIGHT weights[] = {FONTWEIGHT_NORMAL, FONTWEIGHT_BOLD};
+    const auto weight = temper == ORDERLY ? pick(weights) : make<FONTWEIGHT>();
     const auto style = make<FSTYLE>();
     const bool isVertical = flag();
     const bool isEmbedded = flag();

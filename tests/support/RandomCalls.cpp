@@ -1,12 +1,14 @@
 #include "tests/support/RandomCalls.h"
 
 #include "draw/DrawmereImpl.h"
+#include "foundation/common/MoxUtil.h"
 #include "foundation/records/TLMemoryImage.h"
 #include "foundation/records/TLStringWithGlyphInfo.h"
 #include "tests/fonts/EmbeddedFont.h"
 #include "tests/support/TinyImages.h"
 #include "tree/SVGTreeManager.h"
 
+#include <algorithm>
 #include <tuple>
 
 namespace DrawmereTest {
@@ -122,7 +124,11 @@ void drawRun(RandomCalls& any, Drawmere& page) {
     const bool isWhole = any.flag();
     std::vector<TalFont::TLGlyphEntry> entries;
     for (unsigned count = hasGlyphs ? any.below(4) : 0; count > 0; --count) {
-        entries.push_back({any.make<std::int16_t>(), any.make<std::uint16_t>()});
+        const auto place = static_cast<std::int32_t>(entries.size());
+        const bool isOrderly = any.temper == RandomCalls::ORDERLY;
+        const std::int16_t charCount =
+            isOrderly ? (place < text.length() ? 1 : 0) : any.make<std::int16_t>();
+        entries.push_back({charCount, any.make<std::uint16_t>()});
     }
     TalFont::TLStringWithGlyphInfo glyphs(entries);
     page.drawText(text, x, y, rotate, mode, hasGlyphs ? &glyphs : nullptr, isWhole, any.flag());
@@ -141,6 +147,37 @@ void drawNoImage(RandomCalls& any, Drawmere& page) {
     page.drawImage(nullptr, any.make<TLGraphicType>(), length, length, length, length);
 }
 
+UnicodeString makeNewName(RandomCalls& any) {
+    return any.temper == RandomCalls::ORDERLY
+               ? u"n" + MoxCommonNS::MoxUtil::toString(++any.newNumber)
+               : any.make<UnicodeString>();
+}
+
+void setView(RandomCalls& any, Drawmere& page) {
+    const UnicodeString name = makeNewName(any);
+    const auto x = any.make<float>();
+    const auto y = any.make<float>();
+    const auto width = any.make<float>();
+    page.setInternalView(name, x, y, width, any.make<float>());
+}
+
+void setAnchor(RandomCalls& any, Drawmere& page) {
+    const UnicodeString name = makeNewName(any);
+    const auto x = any.make<float>();
+    page.setInternalLinkAnchor(name, x, any.make<float>());
+}
+
+void startPage(RandomCalls& any, Drawmere& page) {
+    const int number = any.temper == RandomCalls::ORDERLY ? ++any.newNumber : any.make<int>();
+    page.startPage(number, any.make<MoxRectT<MoxLength>>());
+}
+
+void setWritingMode(RandomCalls& any, Drawmere& page) {
+    constexpr const char16_t* modes[] = {u"lr-tb", u"rl-tb", u"tb-rl", u"lr", u"rl", u"tb"};
+    page.setWritingMode(any.temper == RandomCalls::ORDERLY ? MoxName(any.pick(modes))
+                                                           : any.make<MoxName>());
+}
+
 void openDocument(Drawmere& page, std::ostream& stream) {
     if (page.config->streamOutput) {
         page.initRootSvg(&stream);
@@ -151,6 +188,16 @@ void openDocument(Drawmere& page, std::ostream& stream) {
 
 using Length = MoxLength;
 using Point = const MoxPointT<MoxLength>&;
+
+constexpr auto startGradient =
+    call<With<Length, Length, Length, Length, SVGMatrix, UNITSTYPE, GRADSPERADMOD>::of(
+        &Drawmere::startLinearGradient)>;
+constexpr auto startGradientBetween =
+    call<With<Point, Point, const SVGMatrix&, UNITSTYPE, GRADSPERADMOD>::of(
+        &Drawmere::startLinearGradient)>;
+constexpr auto startLink =
+    call<With<const UnicodeString&, const MoxName&>::of(&Drawmere::startLink)>;
+constexpr auto startLinkOfValue = call<With<const MoxValue&>::of(&Drawmere::startLink)>;
 
 /// Calls that take pointers stand at the end, those that begin and end documents in `draw`.
 constexpr void (*calls[])(RandomCalls& any, Drawmere& page) = {
@@ -177,7 +224,7 @@ constexpr void (*calls[])(RandomCalls& any, Drawmere& page) = {
     call<&Drawmere::setLineCap>,
     call<&Drawmere::setLineJoin>,
     call<&Drawmere::setMiterLimit>,
-    call<&Drawmere::setWritingMode>,
+    setWritingMode,
     call<&Drawmere::setClipRuleAttrVal>,
     call<&Drawmere::startPathData>,
     call<&Drawmere::endPathData>,
@@ -196,21 +243,19 @@ constexpr void (*calls[])(RandomCalls& any, Drawmere& page) = {
     call<&Drawmere::drawEllipse>,
     call<&Drawmere::startPattern>,
     call<&Drawmere::startMask>,
-    call<With<Length, Length, Length, Length, SVGMatrix, UNITSTYPE, GRADSPERADMOD>::of(
-        &Drawmere::startLinearGradient)>,
-    call<With<Point, Point, const SVGMatrix&, UNITSTYPE, GRADSPERADMOD>::of(
-        &Drawmere::startLinearGradient)>,
+    startGradient,
+    startGradientBetween,
     call<&Drawmere::startRadialGradient>,
     call<&Drawmere::setStopColor>,
     call<&Drawmere::endGradiant>,
     call<&Drawmere::endMask>,
     call<&Drawmere::endPattern>,
-    call<With<const UnicodeString&, const MoxName&>::of(&Drawmere::startLink)>,
-    call<With<const MoxValue&>::of(&Drawmere::startLink)>,
+    startLink,
+    startLinkOfValue,
     call<&Drawmere::endLink>,
-    call<&Drawmere::setInternalView>,
-    call<&Drawmere::setInternalLinkAnchor>,
-    call<&Drawmere::startPage>,
+    setView,
+    setAnchor,
+    startPage,
     call<&Drawmere::endPage>,
     call<&Drawmere::hasError>,
     call<&Drawmere::popError>,
@@ -223,6 +268,51 @@ constexpr void (*calls[])(RandomCalls& any, Drawmere& page) = {
     drawNoImage,
     drawFile,
     setTestFont,
+};
+
+constexpr void (*pathCalls[])(RandomCalls& any, Drawmere& page) = {
+    call<&Drawmere::endPathData>,
+    call<&Drawmere::setPathMoveTo>,
+    call<&Drawmere::setPathLineTo>,
+    call<&Drawmere::setPathCubicBezierCurveTo>,
+    call<&Drawmere::setPathQuadraticBezierCurveTo>,
+    call<&Drawmere::setPathClosepath>,
+};
+
+constexpr void (*gradientCalls[])(RandomCalls& any, Drawmere& page) = {
+    call<&Drawmere::setStopColor>,
+    call<&Drawmere::setStopColor>,
+    call<&Drawmere::endGradiant>,
+};
+
+/// Returns: one of the calls that can be made now.
+auto pickCall(RandomCalls& any, const DrawmereImpl& impl) {
+    if (any.temper == RandomCalls::ORDERLY && impl.savedGroupManager) {
+        return any.pick(pathCalls);
+    }
+    if (any.temper == RandomCalls::ORDERLY && !impl.treeManager->unlocked) {
+        return any.pick(gradientCalls);
+    }
+    return any.pick(calls);
+}
+
+/// How a state is opened and how it ends.
+struct Bracket {
+    void (*open)(RandomCalls& any, Drawmere& page);
+    void (*close)(RandomCalls& any, Drawmere& page);
+};
+
+constexpr Bracket brackets[] = {
+    {call<&Drawmere::pushState>, call<&Drawmere::popState>},
+    {call<&Drawmere::startPattern>, call<&Drawmere::endPattern>},
+    {startGradient, call<&Drawmere::endGradiant>},
+    {startGradientBetween, call<&Drawmere::endGradiant>},
+    {call<&Drawmere::startRadialGradient>, call<&Drawmere::endGradiant>},
+    {call<&Drawmere::startMask>, call<&Drawmere::endMask>},
+    {call<&Drawmere::startClipDef>, call<&Drawmere::endClipDef>},
+    {call<&Drawmere::startClipRect>, call<&Drawmere::endClipDef>},
+    {startLink, call<&Drawmere::endLink>},
+    {startLinkOfValue, call<&Drawmere::endLink>},
 };
 
 /// The id of the definition that is written now, empty when none is.
@@ -241,7 +331,11 @@ UnicodeString getOpenDefinition(const DrawmereImpl& impl) {
 void RandomCalls::makeCall(Drawmere& page) {
     const std::size_t idCount = ids.size();
     const UnicodeString clip = page.impl->clipPathId;
-    pick(calls)(*this, page);
+    const auto picked = pickCall(*this, *page.impl);
+    if (temper == ORDERLY && !keepOrder(picked)) {
+        return;
+    }
+    picked(*this, page);
     if (!page.impl) {
         return;
     }
@@ -261,15 +355,42 @@ void RandomCalls::draw(Drawmere& page, std::ostream& stream, int count) {
                 ids.clear();
                 openDocument(page, stream);
             } else if (below(callsOfADocument) == callsOfADocument - 1) {
-                page.finishRootSvg();
+                finishDocument(page);
             } else {
                 makeCall(page);
             }
         } catch (const MoxError&) { // NOLINT(bugprone-empty-catch): calls in no order throw
         }
     }
-    page.finishRootSvg();
+    finishDocument(page);
     page.finish();
+}
+
+bool RandomCalls::keepOrder(Call picked) {
+    for (const Bracket& bracket : brackets) {
+        if (picked == bracket.open) {
+            openStates.push_back(bracket.close);
+            return true;
+        }
+    }
+    const bool isEnd = std::ranges::find(brackets, picked, &Bracket::close) != std::end(brackets);
+    if (isEnd && (openStates.empty() || openStates.back() != picked)) {
+        return false;
+    }
+    if (isEnd) {
+        openStates.pop_back();
+    }
+    return true;
+}
+
+void RandomCalls::finishDocument(Drawmere& page) {
+    if (page.impl && page.impl->savedGroupManager && temper == ORDERLY) {
+        page.endPathData(PAINTMODE_FILL);
+    }
+    for (; page.impl && !openStates.empty(); openStates.pop_back()) {
+        openStates.back()(*this, page);
+    }
+    page.finishRootSvg();
 }
 
 } // namespace DrawmereTest

@@ -22,6 +22,10 @@ public:
     enum Temper {
         WILD, ///< any number and any text
         TAME, ///< numbers of the size of a page, listed enumerators, words and ids that were made
+        /// Tame, and as the header asks: nothing but its parts in a path or a gradient, states that
+        /// all end, a new name for each destination and a new number for each page, words of SVG
+        /// where they are wanted.
+        ORDERLY,
     };
 
     explicit RandomCalls(unsigned seed, Temper kind = WILD) : Choices(seed), temper(kind) {}
@@ -40,7 +44,7 @@ public:
     /// the others are anything, or small too where they are tame.
     template <typename T> T make() {
         static_assert(std::is_enum_v<T> || std::is_integral_v<T>, "other types have their own");
-        if (temper == TAME) {
+        if (temper != WILD) {
             return static_cast<T>(below(3));
         }
         return static_cast<T>(flag() ? static_cast<int>(below(7)) - 2 : static_cast<int>(number()));
@@ -60,9 +64,16 @@ public:
     std::vector<UnicodeString> ids;       ///< of definitions in the open document, in order
     std::vector<UnicodeString> lostIds;   ///< of those whose start call wrote no definition
     std::vector<UnicodeString> madeTexts; ///< what was made as an argument, in order
+    int newNumber = 0;                    ///< of the last page or name that had to be a new one
 
 private:
+    using Call = void (*)(RandomCalls& any, Drawmere& page);
+
     void makeCall(Drawmere& page);
+    bool keepOrder(Call picked);
+    void finishDocument(Drawmere& page);
+
+    std::vector<Call> openStates; ///< what ends each of them, where order is kept
 };
 
 template <> bool RandomCalls::make<bool>();
