@@ -49,7 +49,7 @@ std::string describe(const std::vector<XmlEvent>& events, std::size_t place) {
     }
     std::string text = events[place].name + ":" + events[place].text;
     for (const auto& [name, value] : events[place].attributes) {
-        text += " " + name + "='" + value + "'";
+        text.append(" ").append(name).append("='").append(value).append("'");
     }
     return text;
 }

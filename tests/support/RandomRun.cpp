@@ -5,6 +5,15 @@
 #include <filesystem>
 
 namespace DrawmereTest {
+namespace {
+
+// ASCII, with references for what it can't carry, is UTF-8 too; an unknown encoding means UTF-8.
+constexpr const char16_t* encodings[] = {u"", u"US-ASCII", u"UTF-8", u"none such"};
+
+// Mostly the one that is there: without it some forms of run write nothing.
+constexpr const char16_t* copyFolders[] = {u"./", u"./", u"./", u"./", u"", u"missing/"};
+
+} // namespace
 
 RandomRun::RandomRun(RandomCalls& choices)
     : calls(choices), uri(output.uri("page.svg"), choices.make<UnicodeString>()) {
@@ -13,6 +22,10 @@ RandomRun::RandomRun(RandomCalls& choices)
     config.singleFile = calls.flag();
     config.gzip = calls.flag();
     config.keepPageNumber = calls.flag();
+    config.checkPaths = calls.below(4) == 3;
+    config.encoding = calls.pick(encodings);
+    config.imageCopyUri = calls.pick(copyFolders);
+    config.copyNamePrefix = calls.make<UnicodeString>();
 }
 
 std::vector<std::string> RandomRun::draw(int count) {
