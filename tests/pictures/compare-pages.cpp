@@ -1,8 +1,8 @@
 // compare-pages [-d DIRECTORY] [-a SCALE] EXPECTED.png PAGE.png...: for each pair prints a line
 // with the share of pixels that differ visibly, in percent. Pictures are blurred by one pixel
 // before, so that what renderers make of an edge doesn't count. With -d, pictures of both beside
-// each other and of the difference go to the directory, named like the page. With -a the expected
-// pictures are SCALE times as large as the pages, and each square of that many pixels becomes their
+// each other and of the difference go to the directory, named like the page. With -a the pictures
+// are SCALE times as large as they are to be, and each square of that many pixels becomes their
 // average.
 
 #include <algorithm>
@@ -222,7 +222,7 @@ void writeTriple(const Pixels& expected, const Pixels& page, const Comparison& r
 
 struct Options {
     std::string directory; ///< of pictures of the differences, if any
-    int scale = 1;         ///< of the expected pictures
+    int scale = 1;         ///< of the pictures
 };
 
 /// Takes the options off of the front of `files`.
@@ -241,7 +241,7 @@ Options takeOptions(std::vector<const char*>& files) {
 
 void compareFiles(const char* expectedPath, const char* pagePath, const Options& options) {
     const Pixels expected = shrink(readPixels(expectedPath), options.scale);
-    const Pixels page = readPixels(pagePath);
+    const Pixels page = shrink(readPixels(pagePath), options.scale);
     const Comparison result = compare(expected, page);
     std::printf("%.3f\n", result.percent());
     if (!options.directory.empty()) {
