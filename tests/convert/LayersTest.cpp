@@ -115,6 +115,14 @@ TEST(Layers, AMaskEndsWithWhatItMasks) {
     EXPECT_EQ(page.count("rect"), 3);
 }
 
+TEST(Layers, AMaskStaysWhereItIsWhenWhatItMasksHasAMatrix) {
+    const DrawnPage page(makeMasked("0.5 g 0 0 200 100 re f", "1 0 0 4 0 0 cm 5 w 5 2 m 60 9 l S"));
+    EXPECT_EQ(page.count("pattern"), 1);
+    const std::string body = page.svg.substr(page.svg.rfind("</defs>"));
+    EXPECT_THAT(body, HasSubstr("mask=\"url(#i0)\""));
+    EXPECT_THAT(body, Not(HasSubstr("matrix(")));
+}
+
 /// A page that fills `backdrop`, and over it a green square with a blend mode.
 PageSource makeBlended(const std::string& mode, const std::string& backdrop) {
     return {backdrop + " /G gs 0 1 0 rg 10 10 50 50 re f", "/ExtGState<</G<</BM/" + mode + ">>>>"};

@@ -349,6 +349,19 @@ bool Layers::enter(const fz_rect& bounds) {
     return !scopes.back()->isHidden && clips().enter(bounds);
 }
 
+// The matrix would move a mask, too, so the mask goes to a pattern that shows the object.
+void Layers::drawMoved(const fz_rect& bounds, const std::function<void()>& draw) {
+    if (canvas.getEffects().mask.isEmpty()) {
+        draw();
+        return;
+    }
+    const fz_rect area = roundOut(bounds);
+    const UnicodeString id = canvas.beginPattern(area, fz_identity);
+    draw();
+    canvas.endPattern();
+    canvas.fill(toPath(area), /*isEvenOdd=*/true, {MoxColor(), id});
+}
+
 void Layers::fillClip(const fz_rect& bounds, const Paint& paint) {
     if (scopes.back()->isHidden) {
         return;

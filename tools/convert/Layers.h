@@ -65,7 +65,11 @@ public:
     /// Makes the document ready for an object. Returns: whether it shows.
     bool enter(const fz_rect& bounds);
 
-    /// The same for the image that `findMaskOf` gave its mask to.
+    /// Has `draw` draw inside `bounds`, which the document is ready for, what has a matrix of its
+    /// own.
+    void drawMoved(const fz_rect& bounds, const std::function<void()>& draw);
+
+    /// The same as `enter` for the image that `findMaskOf` gave its mask to.
     bool enterMasked(const fz_rect& bounds) {
         return !scopes.back()->isHidden && clips().enter(bounds);
     }

@@ -68,10 +68,12 @@ void PagePainter::stroke(const fz_stroke_state& style, const StrokeMatrices& mat
         canvas.stroke(current, paint, pen);
         return;
     }
-    canvas.push();
-    canvas.transform(matrices.document);
-    canvas.stroke(current, paint, pen);
-    canvas.pop();
+    layers.drawMoved(fz_transform_rect(bounds, matrices.document), [&] {
+        canvas.push();
+        canvas.transform(matrices.document);
+        canvas.stroke(current, paint, pen);
+        canvas.pop();
+    });
 }
 
 void PagePainter::clipPath(const fz_path* path, bool isEvenOdd, const fz_matrix& matrix) {
@@ -132,9 +134,17 @@ bool PagePainter::writeSpan(const fz_text_span& span, const fz_matrix& matrix,
     }
     const TextSpan text(span, layers.place(matrix), font);
     if (!text.isEmpty() && layers.enter(text.getBounds())) {
-        texts.write(text, paint);
+        writeEntered(text, paint);
     }
     return true;
+}
+
+void PagePainter::writeEntered(const TextSpan& text, const TextPaint& paint) {
+    if (text.isTurned) {
+        layers.drawMoved(text.getBounds(), [&] { texts.write(text, paint); });
+    } else {
+        texts.write(text, paint);
+    }
 }
 
 // Text that doesn't show can still be searched for, if it is text.

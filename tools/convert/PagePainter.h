@@ -89,6 +89,7 @@ private:
     void stroke(const fz_stroke_state& style, const StrokeMatrices& matrices, const Paint& paint);
     /// Writes what the mode of text lets be text. Returns: false for a span that is to be drawn.
     bool writeSpan(const fz_text_span& span, const fz_matrix& matrix, const TextPaint& paint);
+    void writeEntered(const TextSpan& text, const TextPaint& paint);
     void writeText(const fz_text& text, const fz_matrix& matrix, const TextPaint& paint);
     void drawGlyphs(const std::vector<DrawnGlyph>& glyphs, const fz_matrix& matrix,
                     const Paint& paint);
