@@ -184,6 +184,19 @@ TEST(Images, LinkedWhatLiesInNoFileOfItsOwnIsEmbedded) {
     EXPECT_EQ(conversion.list().size(), 4U); // the image among them
 }
 
+TEST(Images, ADocumentThatIsAnImageIsLinkedWhereItIs) {
+    const Conversion conversion;
+    const std::string input = Conversion::document("image-streams-small.pdf");
+    EXPECT_EQ(conversion.runShell("$convert -p 3 --images copy-all -o in/page.svg " + input).status,
+              0);
+    EXPECT_EQ(conversion.runShell("cp in/page-1.* 'it#s.jpg'").status, 0);
+    EXPECT_EQ(conversion.runShell("$convert --images link -o out/ 'it#s.jpg'").status, 0);
+    const std::string page = conversion.directory.read("out/it#s.svg");
+    EXPECT_THAT(page, HasSubstr("xlink:href=\"../it%23s.jpg\""));
+    EXPECT_THAT(page, Not(HasSubstr("data:")));
+    EXPECT_EQ(conversion.list("out").size(), 1U);
+}
+
 TEST(Images, ConversionResolutionAndQualityReachThem) {
     const Conversion conversion;
     const std::string input = Conversion::document("image-streams-small.pdf");

@@ -106,8 +106,8 @@ private:
         app.add_option(
                "--images", options.images,
                "Images into the pages (embed-all), into files beside them (copy-all, or copy with "
-               "names made of their content), or linked where they are (link; those inside documents are "
-               "embedded)")
+               "names made of their content), or linked where they are (link: documents that are "
+               "PNG or JPEG images; those inside other documents are embedded)")
             ->check(CLI::IsMember({"embed-all", "link", "copy-all", "copy"}))
             ->option_text("WORD");
         app.add_option("--image-format", options.imageFormat, "auto, jpeg, png, jpg-all or png-all")

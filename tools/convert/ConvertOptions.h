@@ -3,6 +3,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <string>
 
 namespace DrawmereConvert {
 
@@ -20,6 +21,10 @@ struct ConvertOptions {
 
     /// Images of more bytes go to a file beside the page, when the page goes to a file.
     std::size_t maxInlineBytes = 7'300'000;
+
+    /// An image that is all of this file is linked to under the reference; none when it is empty.
+    std::string linkFile;
+    std::string linkReference; ///< UTF-8, from the place of the pages
 
     int maxDepth = 256; ///< of elements; what would go deeper is drawn without its clip or mask
 

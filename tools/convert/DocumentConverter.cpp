@@ -57,6 +57,11 @@ void DocumentConverter::open(const std::string& path, const std::string& passwor
     file->open(path, password);
 }
 
+void DocumentConverter::link(const std::string& path, const std::string& reference) {
+    options.linkFile = path;
+    options.linkReference = reference;
+}
+
 int DocumentConverter::getPageCount() const { return file->pageCount; }
 
 std::string DocumentConverter::getTitle() const {

@@ -50,6 +50,10 @@ public:
     void open(const std::string& path, const std::string& password);
 
     /// Returns: the count of pages, above 0 once a document is open.
+    /// Has the image that the document is, if it is one, linked to in place of stored.
+    /// Shape: `reference`, UTF-8, from the place of the pages.
+    void link(const std::string& path, const std::string& reference);
+
     int getPageCount() const;
 
     /// Returns: the title from the document's own data, UTF-8, or nothing.

@@ -70,9 +70,19 @@ DOCUMENTSTATE DocumentRun::open() {
     }
     const OutputNames names(options, input, count);
     directory = names.getDirectory();
+    if (options.images == "link") {
+        linkDocument();
+    }
     targets.singleFile = options.isOneDocument();
     nameTargets(names);
     return options.writesToOutput() ? DOCUMENTSTATE_DONE : checkFiles(names);
+}
+
+void DocumentRun::linkDocument() {
+    std::error_code isElsewhere;
+    const fs::path place = directory.empty() ? "." : directory;
+    const fs::path path = fs::relative(input, place, isElsewhere);
+    converter.link(input, OutputNames::toReference(path.empty() ? input : path.string()));
 }
 
 void DocumentRun::nameTargets(const OutputNames& names) {

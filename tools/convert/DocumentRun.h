@@ -47,6 +47,8 @@ private:
     DOCUMENTSTATE open();
     DOCUMENTSTATE convert();
     DOCUMENTSTATE checkFiles(const OutputNames& names);
+    /// Has an image that is a document stay where it is.
+    void linkDocument();
     void nameTargets(const OutputNames& names);
     bool runPool(const OutputNames& names, const PartialFiles* files, const InterruptGuard& guard);
     void take(const PageOutcome& outcome, ProgressBar& bar);

@@ -6,6 +6,9 @@
 
 #include <algorithm>
 #include <cmath>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
 #include <sstream>
 #include <utility>
 
@@ -94,16 +97,29 @@ const ImageWriter::ImageFile& ImageWriter::findFile(const ImageKey& key) {
         fz_keep_image(ctx, key.image);
         fz_keep_image(ctx, key.mask);
         entry->second.bytes = packBitmap(makeBytes(key));
-        entry->second.name = makeName(entry->second.bytes);
+        entry->second.isLinked = isLinkedFile(entry->second.bytes);
+        entry->second.name = entry->second.isLinked ? UnicodeString::fromUTF8(options.linkReference)
+                                                    : makeName(entry->second.bytes);
     }
     return entry->second;
+}
+
+bool ImageWriter::isLinkedFile(const std::string& bytes) const {
+    std::error_code isMissing;
+    if (options.linkFile.empty() || bytes.empty() ||
+        std::filesystem::file_size(options.linkFile, isMissing) != bytes.size()) {
+        return false;
+    }
+    std::ifstream file(options.linkFile, std::ios::binary);
+    return std::equal(bytes.begin(), bytes.end(), std::istreambuf_iterator<char>(file),
+                      std::istreambuf_iterator<char>());
 }
 
 std::string ImageWriter::makeBytes(const ImageKey& key) {
     const bool isAsItIs = !key.mask && key.use == COLORUSE_PICTURE && !key.image->imagemask;
     std::string stored = isAsItIs ? findStoredImage(ctx, key.image) : std::string();
     // Only a photograph looks no better for sharp edges.
-    const bool isKept = key.zoom == 1 || stored.starts_with("\xFF\xD8");
+    const bool isKept = key.zoom == 1 || stored.starts_with("\xFF\xD8") || isLinkedFile(stored);
     return stored.empty() || !isKept ? decode(key) : stored;
 }
 
@@ -197,13 +213,13 @@ void ImageWriter::drawUnit(const ImageFile& file, float width, float height, flo
     const MoxName chosen = config.imageProcessingName;
     const bool isLarge = file.bytes.size() > options.maxInlineBytes && !config.streamOutput &&
                          !file.bytes.starts_with("BM");
-    if (isLarge) {
-        config.setImageProcessingType(MoxName(u"copy"));
+    if (file.isLinked || isLarge) {
+        config.setImageProcessingType(MoxName(file.isLinked ? u"link" : u"copy"));
     }
     canvas.beginElement();
     canvas.out.drawImage(&image, image.getGraphicType(), pt(width), pt(height), pt(x), pt(y));
     canvas.endElement();
-    if (isLarge) {
+    if (file.isLinked || isLarge) {
         config.setImageProcessingType(chosen);
     }
 }

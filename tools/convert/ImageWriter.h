@@ -55,9 +55,11 @@ private:
     struct ImageFile {
         std::string bytes;
         UnicodeString name;
+        bool isLinked = false; ///< the name says where it lies
     };
 
     const ImageFile& findFile(const ImageKey& key);
+    bool isLinkedFile(const std::string& bytes) const;
     std::string makeBytes(const ImageKey& key);
     std::string decode(const ImageKey& key);
     std::string packBitmap(std::string bytes);
