@@ -6,6 +6,9 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <regex>
+
 namespace DrawmereTest {
 namespace {
 
@@ -13,6 +16,7 @@ using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::Not;
 using testing::StartsWith;
+using testing::UnorderedElementsAre;
 
 /// A conversion of a document of twelve plain pages.
 struct TwelvePages : testing::Test {
@@ -113,7 +117,16 @@ TEST_F(ProgramRun, TwiceGivesTheSameBytes) {
     EXPECT_EQ(conversion.runShell("cd out; cksum *").output, listing);
 }
 
-TEST_F(ProgramRun, QuietSaysNothingAndVerboseMore) { EXPECT_EQ(run({"--quiet"}), ""); }
+TEST_F(ProgramRun, QuietSaysNothingAndVerboseMore) {
+    EXPECT_EQ(run({"--quiet"}), "");
+    const std::string input = Conversion::document("FillStrokeOrdering.pdf");
+    const auto say = [&](const std::string& option) {
+        return conversion.run({input, option, "-o", "out/"}).output;
+    };
+    EXPECT_THAT(say("--verbose"), HasSubstr("page 1: 1 knockout group drawn as a plain one"));
+    EXPECT_THAT(say("--no-index"), Not(HasSubstr("page 1: ")));
+    EXPECT_THAT(say("--no-index"), HasSubstr("; 1 knockout group drawn as a plain one"));
+}
 
 TEST_F(ProgramRun, AStrangersIndexIsNotReplaced) {
     conversion.directory.write("index.html", "<p>mine</p>");
@@ -123,13 +136,43 @@ TEST_F(ProgramRun, AStrangersIndexIsNotReplaced) {
     EXPECT_EQ(conversion.directory.read("index.html"), "<p>mine</p>");
 }
 
+/// Returns: the files that the attributes `name` in a file of `out` refer to, as paths there.
+std::vector<std::string> followReferences(const Conversion& conversion, const std::string& file,
+                                          const std::string& name) {
+    const std::string bytes = conversion.directory.read("out/" + file);
+    const std::regex attribute(" " + name + "=\"([^\"#]+)[\"#]");
+    const std::regex escape("%([0-9A-F]{2})");
+    std::vector<std::string> files;
+    for (std::sregex_iterator at(bytes.begin(), bytes.end(), attribute), end; at != end; ++at) {
+        std::string path = (*at)[1];
+        for (std::smatch found; std::regex_search(path, found, escape);) {
+            const auto letter = static_cast<char>(std::stoi(found[1], nullptr, 16));
+            // A percent sign that is put in place must not be read as another escape.
+            path.replace(static_cast<std::size_t>(found.position()), 3, 1,
+                         letter == '%' ? '\x01' : letter);
+        }
+        std::ranges::replace(path, '\x01', '%');
+        path = std::regex_replace(path, std::regex("&amp;"), "&");
+        files.push_back(path);
+    }
+    return files;
+}
+
 TEST_F(ProgramRun, NamesMayHoldAnything) {
-    conversion.directory.write("a b#c%20.pdf", makePlainPdf(2));
-    EXPECT_EQ(conversion.run({"a b#c%20.pdf", "-o", "file:o/"}).status, 0);
-    EXPECT_THAT(conversion.list("file:o"),
-                ElementsAre("a b#c%201.svg", "a b#c%202.svg", "index.html"));
-    EXPECT_THAT(conversion.directory.read("file:o/index.html"),
-                HasSubstr("data-file=\"a%20b%23c%25202.svg\""));
+    for (const std::string stem : {"a b#c%20", "pl\u00E4n \u65E5\u672C", "q?&'<>\"", "x:y"}) {
+        const Conversion other;
+        other.directory.write(stem + ".pdf", TinyPdf().addLinkPage(1).addLinkPage(0).write());
+        EXPECT_EQ(other.run({"./" + stem + ".pdf", "-o", "out/"}).status, 0);
+        EXPECT_THAT(other.list("out"),
+                    UnorderedElementsAre(stem + "1.svg", stem + "2.svg", "index.html"));
+        EXPECT_THAT(followReferences(other, stem + "1.svg", "xlink:href"),
+                    ElementsAre(stem + "2.svg"));
+        EXPECT_THAT(followReferences(other, "index.html", "data-file"),
+                    ElementsAre(stem + "1.svg", stem + "2.svg"));
+    }
+    EXPECT_EQ(run({"--pages", "1", "-o", "file:o/"}), "a.pdf: 1 page written to file:o/a.svg\n");
+    run({"--single-file", "-o", "a:b.svg"});
+    EXPECT_TRUE(conversion.directory.has("a:b.svg"));
 }
 
 TEST_F(ProgramRun, SeveralDocumentsShareAnIndex) {
@@ -157,6 +200,44 @@ TEST(Jobs, AnyNumberOfThemGivesTheSameBytes) {
             EXPECT_THAT(one, HasSubstr("index.html"));
         }
     }
+}
+
+// The pages that take for ever are drawn at the same time.
+TEST(Jobs, EachIsAProcess) {
+    const Conversion conversion;
+    conversion.directory.write("a.pdf", TinyPdf().addEndlessPage().addEndlessPage().write());
+    for (const std::string jobs : {"1", "2"}) {
+        const CommandResult result = conversion.runShell(
+            "$convert a.pdf -q -o out/ --timeout .5 --jobs " + jobs +
+            " 2>&1 & p=$!; sleep .2; wc -w </proc/$p/task/$p/children; wait $p");
+        EXPECT_THAT(result.output, StartsWith(jobs + "\n"));
+    }
+}
+
+TEST(Text, WordsChooseWhatItBecomes) {
+    const Conversion conversion;
+    const std::string input = Conversion::document("pdflatex-outline.pdf");
+    const auto convert = [&](const std::vector<std::string>& more) {
+        std::vector<std::string> words = {input, "-q", "--pages", "3", "-o", "x.svg"};
+        words.insert(words.end(), more.begin(), more.end());
+        EXPECT_EQ(conversion.run(words).status, 0);
+        return conversion.directory.read("x.svg");
+    };
+    EXPECT_EQ(convert({}), convert({"--text", "outlines"}));
+    EXPECT_THAT(convert({}), Not(HasSubstr("</text>")));
+    EXPECT_THAT(convert({"--text", "fonts"}), HasSubstr("<glyph"));
+    EXPECT_THAT(convert({"--text", "plain"}), HasSubstr("</text>"));
+    EXPECT_THAT(convert({"--text", "plain"}), Not(HasSubstr("<glyph")));
+}
+
+TEST(Shadings, TheirResolutionCanBeChosen) {
+    const Conversion conversion;
+    const std::string input = Conversion::document("coons-allflags-withfunction.pdf");
+    const auto measure = [&](const std::string& dpi) {
+        EXPECT_EQ(conversion.run({input, "-q", "--shading-dpi", dpi, "-o", "x.svg"}).status, 0);
+        return conversion.directory.read("x.svg").size();
+    };
+    EXPECT_GT(measure("200"), 2 * measure("50"));
 }
 
 TEST(Images, WordsChooseWhereTheyGo) {

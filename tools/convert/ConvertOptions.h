@@ -26,6 +26,11 @@ struct ConvertOptions {
     std::string linkFile;
     std::string linkReference; ///< UTF-8, from the place of the pages
 
+    // More than this is reported: viewers that are built on libxml2 refuse attributes of 10 MB, and
+    // librsvg documents of a million elements. A shape has a group around it as a rule.
+    std::size_t maxPathPoints = 600'000;
+    std::int64_t maxShapes = 500'000;
+
     int maxDepth = 256; ///< of elements; what would go deeper is drawn without its clip or mask
 
     // The page of documents that have none of their own, in points.

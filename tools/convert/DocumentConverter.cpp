@@ -16,8 +16,6 @@ namespace {
 
 PageSize getSize(const fz_rect& bounds) { return {bounds.x1 - bounds.x0, bounds.y1 - bounds.y0}; }
 
-constexpr std::int64_t maxElements = 1'000'000;
-
 bool usesOverprint(const DocumentFile& file) {
     fz_context* ctx = file.ctx;
     fz_page* page = file.page;
@@ -135,7 +133,7 @@ PageReport DocumentConverter::drawPage(const PagePlace& place, const PageTargets
     if (!place.isSingle) {
         painter.clipToPage();
     }
-    report.isComplete = runPage(*file, painter, matrix);
+    const bool isRead = runPage(*file, painter, matrix);
     if (painter.failure) {
         std::rethrow_exception(painter.failure);
     }
@@ -144,10 +142,10 @@ PageReport DocumentConverter::drawPage(const PagePlace& place, const PageTargets
     links.writeLinks(readLinks(file->ctx, file->document, file->page), report);
     links.writeDestinations();
     drawmere.endPage();
-    report.isComplete = report.isComplete && file->cookie.errors == 0;
+    report.isComplete = report.isComplete && isRead && file->cookie.errors == 0;
     report.messages = std::exchange(file->messages, {});
-    if (painter.canvas.getElementCount() > maxElements) {
-        report.messages.emplace_back("more than a million elements, which some viewers refuse");
+    if (painter.canvas.getElementCount() > options.maxShapes) {
+        report.note(APPROXIMATION_LIMIT);
     }
     if (usesOverprint(*file)) {
         report.note(APPROXIMATION_OVERPRINT);

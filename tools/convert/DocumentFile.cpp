@@ -13,6 +13,7 @@ namespace DrawmereConvert {
 namespace {
 
 constexpr std::size_t storeBytes = std::size_t{64} << 20U;
+constexpr int maxPages = 1'000'000;
 constexpr std::size_t maxMessages = 100; // a broken page can repeat itself without end
 
 /// Returns: whether what reads the document goes on to read its file page by page. The others hold
@@ -104,6 +105,10 @@ void DocumentFile::countPages() {
     }
     if (pageCount < 1) {
         throw ConvertError(CONVERTERROR_NOPAGES, "there are no pages");
+    }
+    if (pageCount > maxPages) {
+        throw ConvertError(CONVERTERROR_UNREADABLE,
+                           "it claims to have " + std::to_string(pageCount) + " pages");
     }
 }
 

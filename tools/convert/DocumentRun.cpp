@@ -1,10 +1,11 @@
 #include "tools/convert/DocumentRun.h"
 
+#include "tools/convert/ChildCall.h"
 #include "tools/convert/InterruptGuard.h"
 #include "tools/convert/JobPool.h"
+#include "tools/convert/LastWords.h"
 #include "tools/convert/PageWriter.h"
 #include "tools/convert/ProgressBar.h"
-#include "tools/convert/Watchdog.h"
 
 #include <algorithm>
 #include <cstdio>
@@ -16,6 +17,7 @@ namespace {
 namespace fs = std::filesystem;
 
 constexpr int wholeDocument = -1;
+constexpr double patience = 2; // with a process that is to end itself
 
 bool isSameFile(const std::string& one, const std::string& other) {
     std::error_code failure;
@@ -45,14 +47,53 @@ void DocumentRun::say(const std::string& text) const {
 }
 
 DOCUMENTSTATE DocumentRun::run() {
-    const std::string late = input + ": it takes too long to read the document\n";
-    endProcessAfter(options.timeout, late.c_str(), EXITSTATUS_UNREADABLE);
+    DOCUMENTSTATE state = tryReading();
+    if (state == DOCUMENTSTATE_DONE) {
+        state = read(EXITSTATUS_UNREADABLE);
+    }
+    if (state == DOCUMENTSTATE_DONE) {
+        state = convert();
+    }
+    const bool hasPages = state == DOCUMENTSTATE_DONE || state == DOCUMENTSTATE_INCOMPLETE;
+    const bool wantsOutline = options.index != INDEXMODE_NEVER && !options.isOneDocument();
+    return hasPages && wantsOutline && !readOutline() ? DOCUMENTSTATE_INCOMPLETE : state;
+}
+
+/// Reads the document in another process first, when there are others that this one is to survive
+/// for.
+DOCUMENTSTATE DocumentRun::tryReading() {
+    if (options.inputs.size() == 1) {
+        return DOCUMENTSTATE_DONE;
+    }
+    const ChildResult result = callApart(
+        [this] { return std::string(1, static_cast<char>(read(1))); }, options.timeout * patience);
+    if (!result.reason.empty()) {
+        say(result.reason);
+    }
+    return result.isDone ? static_cast<DOCUMENTSTATE>(result.bytes.front())
+                         : DOCUMENTSTATE_UNREADABLE;
+}
+
+DOCUMENTSTATE DocumentRun::read(int exitStatus) {
+    const LastWords words(input + ": it takes too long to read the document\n",
+                          input + ": the reader of the document broke off\n", options.timeout,
+                          exitStatus);
     const DOCUMENTSTATE opened = open();
     if (opened == DOCUMENTSTATE_DONE) {
         converter.findDestinations(targets);
     }
-    endProcessAfter(0, "", 0);
-    return opened == DOCUMENTSTATE_DONE ? convert() : opened;
+    return opened;
+}
+
+/// Returns: false when there is an outline that can't be read.
+bool DocumentRun::readOutline() {
+    const ChildResult result =
+        callApart([this] { return packOutline(converter.getOutline()); }, options.timeout);
+    outline = unpackOutline(result.bytes);
+    if (!result.isDone) {
+        say("its outline can't be read");
+    }
+    return result.isDone;
 }
 
 DOCUMENTSTATE DocumentRun::open() {
@@ -232,7 +273,7 @@ IndexDocument DocumentRun::describe() const {
     if (document.title.empty()) {
         document.title = fs::path(input).stem().string();
     }
-    document.outline = converter.getOutline();
+    document.outline = outline;
     for (const auto& [page, outcome] : outcomes) {
         if (outcome.isWritten) {
             document.entries.push_back(describePage(outcome));

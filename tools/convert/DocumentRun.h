@@ -44,6 +44,9 @@ public:
 
 private:
     void say(const std::string& text) const;
+    DOCUMENTSTATE tryReading();
+    DOCUMENTSTATE read(int exitStatus);
+    bool readOutline();
     DOCUMENTSTATE open();
     DOCUMENTSTATE convert();
     DOCUMENTSTATE checkFiles(const OutputNames& names);
@@ -65,6 +68,7 @@ private:
     std::string directory;
     std::vector<int> pages;
     PageTargets targets;
+    std::vector<OutlineEntry> outline;
     std::map<int, PageOutcome> outcomes; // by page, the document of all at -1
 };
 

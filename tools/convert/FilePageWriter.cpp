@@ -21,7 +21,8 @@ PageOutcome FilePageWriter::write(int page) {
         const Watchdog watchdog(job.converter, job.options.timeout);
         drawPage(page, config, outcome);
         const std::string file = job.names.getPageFile(page, job.isSinglePage);
-        config.checkMaxFileSize(UnicodeString::fromUTF8(room + file), page + 1);
+        config.checkMaxFileSize(UnicodeString::fromUTF8(room + PartialFiles::nameInside(file)),
+                                page + 1);
         moveFiles(file);
         outcome.isWritten = true;
         noteLateness(outcome, watchdog.hasBarked());
@@ -39,12 +40,13 @@ PageOutcome FilePageWriter::write(int page) {
 void FilePageWriter::drawPage(int page, SVGConfig& config, PageOutcome& outcome) {
     config.streamOutput = false;
     config.keepPageNumber = !job.isSinglePage || job.options.keepNumber;
-    config.svgOutputUri =
-        UnicodeString::fromUTF8(room + job.names.getPageFile(page, job.isSinglePage));
-    config.copyNamePrefix =
-        UnicodeString::fromUTF8(job.names.getPageStem(page, job.isSinglePage) + "-");
-    SVGPageUri uri(UnicodeString::fromUTF8(room + job.names.getWholeFile()),
-                   UnicodeString::fromUTF8(job.names.getNumberFormat()));
+    const auto inside = [](const std::string& name) {
+        return UnicodeString::fromUTF8(PartialFiles::nameInside(name));
+    };
+    const UnicodeString start = UnicodeString::fromUTF8(room);
+    config.svgOutputUri = start + inside(job.names.getPageFile(page, job.isSinglePage));
+    config.copyNamePrefix = inside(job.names.getPageStem(page, job.isSinglePage) + "-");
+    SVGPageUri uri(start + inside(job.names.getWholeFile()), inside(job.names.getNumberFormat()));
     Drawmere drawmere(&config, &uri);
     outcome.size = job.converter.loadPage(page);
     drawmere.initRootSvg(config.svgOutputUri);
@@ -60,14 +62,14 @@ void FilePageWriter::moveFiles(const std::string& pageFile) const {
     std::vector<std::string> others;
     for (const fs::directory_entry& entry : fs::directory_iterator(room)) {
         const std::string name = entry.path().filename().string();
-        if (name != pageFile) {
+        if (name != PartialFiles::nameInside(pageFile)) {
             others.push_back(name);
         }
     }
     for (const std::string& name : others) {
         job.files->moveOut(room + name, name);
     }
-    job.files->moveOut(room + pageFile, pageFile);
+    job.files->moveOut(room + PartialFiles::nameInside(pageFile), pageFile);
 }
 
 void FilePageWriter::clearRoom() const {

@@ -187,7 +187,11 @@ UnicodeString ImageWriter::makeName(const std::string& bytes) {
 void ImageWriter::place(const ImageFile& file, const fz_matrix& matrix, float alpha) {
     const float width = std::hypot(matrix.a, matrix.b);
     const float height = std::hypot(matrix.c, matrix.d);
-    if (file.bytes.empty() || !(width > 0) || !(height > 0)) {
+    if (file.bytes.empty()) {
+        report.isComplete = false;
+        return;
+    }
+    if (!(width > 0) || !(height > 0)) {
         return;
     }
     canvas.flush();
@@ -211,8 +215,12 @@ void ImageWriter::drawUnit(const ImageFile& file, float width, float height, flo
     TLMemoryImage image(file.bytes, file.name);
     SVGConfig& config = *canvas.out.config;
     const MoxName chosen = config.imageProcessingName;
-    const bool isLarge = file.bytes.size() > options.maxInlineBytes && !config.streamOutput &&
-                         !file.bytes.starts_with("BM");
+    const bool isTooLarge =
+        file.bytes.size() > options.maxInlineBytes && !file.bytes.starts_with("BM");
+    const bool isLarge = isTooLarge && !config.streamOutput;
+    if (isTooLarge && !file.isLinked && config.streamOutput) {
+        report.note(APPROXIMATION_LIMIT); // there is no place for a file
+    }
     if (file.isLinked || isLarge) {
         config.setImageProcessingType(MoxName(file.isLinked ? u"link" : u"copy"));
     }

@@ -35,12 +35,19 @@ PagePainter::PagePainter(fz_context* context, const ConvertOptions& chosen,
 
 // Paths.
 
+void PagePainter::noteLength(const PathData& path) {
+    if (path.points.size() > options.maxPathPoints) {
+        report.note(APPROXIMATION_LIMIT);
+    }
+}
+
 void PagePainter::fillPath(const fz_path* path, bool isEvenOdd, const fz_matrix& matrix,
                            const Paint& paint) {
     current.clear();
     readPath(ctx, path, layers.place(matrix), current);
     layers.cutByHand(current);
     if (!current.isEmpty() && layers.enter(current.getBounds())) {
+        noteLength(current);
         canvas.fill(current, isEvenOdd, paint);
     }
 }
@@ -64,6 +71,7 @@ void PagePainter::stroke(const fz_stroke_state& style, const StrokeMatrices& mat
     if (current.isEmpty() || !layers.enter(fz_transform_rect(bounds, matrices.document))) {
         return;
     }
+    noteLength(current);
     if (matrices.isPlain) {
         canvas.stroke(current, paint, pen);
         return;
@@ -79,6 +87,7 @@ void PagePainter::stroke(const fz_stroke_state& style, const StrokeMatrices& mat
 void PagePainter::clipPath(const fz_path* path, bool isEvenOdd, const fz_matrix& matrix) {
     current.clear();
     readPath(ctx, path, layers.place(matrix), current);
+    noteLength(current);
     layers.pushClip(current, isEvenOdd);
 }
 
@@ -100,6 +109,7 @@ void PagePainter::fillText(const fz_text& text, const fz_matrix& matrix, const P
     const std::vector<DrawnGlyph> drawn =
         readOutlines(outlines, text, layers.place(matrix), current);
     if (!current.isEmpty() && layers.enter(current.getBounds())) {
+        noteLength(current);
         canvas.fillText(current, paint);
     }
     drawGlyphs(drawn, matrix, paint);

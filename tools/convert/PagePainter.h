@@ -84,6 +84,8 @@ public:
     std::exception_ptr failure;  ///< what ended the drawing, null as long as all is well
 
 private:
+    /// Notes a path that is too long for some viewers.
+    void noteLength(const PathData& path);
     /// Splits `matrix` between the document and `current`, which is cleared.
     StrokeMatrices startStroke(const fz_matrix& matrix);
     void stroke(const fz_stroke_state& style, const StrokeMatrices& matrices, const Paint& paint);

@@ -1,5 +1,6 @@
 #include "tools/convert/PartialFiles.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <filesystem>
 #include <system_error>
@@ -32,6 +33,11 @@ std::string PartialFiles::makeRoom(int number) const {
     std::string room = place + std::to_string(number) + "/";
     fs::create_directory(room);
     return room;
+}
+
+std::string PartialFiles::nameInside(std::string name) {
+    std::ranges::replace(name, ':', '_');
+    return name;
 }
 
 void PartialFiles::moveOut(const std::string& from, const std::string& name) const {

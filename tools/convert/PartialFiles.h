@@ -22,6 +22,10 @@ public:
     /// Makes a directory in it for one of several writers. Returns: its path, with a slash.
     std::string makeRoom(int number) const;
 
+    /// Returns: what the file `name` is called in a room. The library takes a name with a colon for
+    /// a URI.
+    static std::string nameInside(std::string name);
+
     /// Moves the file `from` to `name` in the target, in place of one that was there.
     /// Throws: std::filesystem::filesystem_error.
     void moveOut(const std::string& from, const std::string& name) const;

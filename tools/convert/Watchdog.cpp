@@ -2,10 +2,8 @@
 
 #include <cmath>
 #include <csignal>
-#include <cstring>
 
 #include <sys/time.h>
-#include <unistd.h>
 
 namespace DrawmereConvert {
 namespace {
@@ -13,31 +11,12 @@ namespace {
 // What a signal handler can reach.
 DocumentConverter* watched = nullptr;
 volatile std::sig_atomic_t barked = 0;
-const char* lastWords = nullptr;
-int lastStatus = 0;
-
-void startTimer(double seconds, void (*handler)(int)) {
-    struct sigaction action = {};
-    action.sa_handler = handler;
-    action.sa_flags = SA_RESTART;
-    sigaction(SIGALRM, &action, nullptr);
-    itimerval timer = {};
-    const double whole = std::floor(seconds);
-    timer.it_value.tv_sec = static_cast<time_t>(whole);
-    timer.it_value.tv_usec = static_cast<suseconds_t>((seconds - whole) * 1e6);
-    setitimer(ITIMER_REAL, &timer, nullptr);
-}
 
 void bark(int /*signal*/) {
     barked = 1;
     if (watched) {
         watched->cancel();
     }
-}
-
-void endProcess(int /*signal*/) {
-    static_cast<void>(!write(STDERR_FILENO, lastWords, std::strlen(lastWords)));
-    _exit(lastStatus);
 }
 
 } // namespace
@@ -55,10 +34,16 @@ Watchdog::~Watchdog() {
 
 bool Watchdog::hasBarked() const { return barked != 0; }
 
-void endProcessAfter(double seconds, const char* message, int status) {
-    lastWords = message;
-    lastStatus = status;
-    startTimer(seconds, &endProcess);
+void startTimer(double seconds, void (*handler)(int)) {
+    struct sigaction action = {};
+    action.sa_handler = handler;
+    action.sa_flags = SA_RESTART;
+    sigaction(SIGALRM, &action, nullptr);
+    itimerval timer = {};
+    const double whole = std::floor(seconds);
+    timer.it_value.tv_sec = static_cast<time_t>(whole);
+    timer.it_value.tv_usec = static_cast<suseconds_t>((seconds - whole) * 1e6);
+    setitimer(ITIMER_REAL, &timer, nullptr);
 }
 
 } // namespace DrawmereConvert

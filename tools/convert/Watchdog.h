@@ -20,9 +20,8 @@ public:
     bool hasBarked() const;
 };
 
-/// Starts a timer that ends the whole process with `status` and the words `message` on its error
-/// stream, for what can't be cancelled. A further call starts it anew; 0 seconds stop it.
-/// Borrows: `message`, until it is stopped.
-void endProcessAfter(double seconds, const char* message, int status);
+/// Has the timer of the process call `handler` once, in place of what it was to do before.
+/// Units: `seconds`; 0 stops it.
+void startTimer(double seconds, void (*handler)(int));
 
 } // namespace DrawmereConvert

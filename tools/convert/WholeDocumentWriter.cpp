@@ -18,13 +18,15 @@ MoxCommonNS::MoxLength toLength(float points) {
 } // namespace
 
 WholeDocumentWriter::WholeDocumentWriter(const PageJob& pageJob, const std::string& place)
-    : job(pageJob), room(place), uri(UnicodeString::fromUTF8(room + job.names.getWholeFile())),
+    : job(pageJob), room(place),
+      uri(UnicodeString::fromUTF8(room + PartialFiles::nameInside(job.names.getWholeFile()))),
       drawmere(&config, &uri) {
     fillConfig(config, job.options);
     config.singleFile = true;
     config.streamOutput = room.empty();
     config.svgOutputUri = uri.getText();
-    config.copyNamePrefix = UnicodeString::fromUTF8(job.names.getPageStem(0, true) + "-");
+    config.copyNamePrefix =
+        UnicodeString::fromUTF8(PartialFiles::nameInside(job.names.getPageStem(0, true) + "-"));
 }
 
 PageOutcome WholeDocumentWriter::write(int page) {
@@ -94,7 +96,8 @@ void WholeDocumentWriter::save() {
     }
     for (const auto& entry : std::filesystem::directory_iterator(room)) {
         const std::string name = entry.path().filename().string();
-        job.files->moveOut(room + name, name);
+        const bool isDocument = name == PartialFiles::nameInside(job.names.getWholeFile());
+        job.files->moveOut(room + name, isDocument ? job.names.getWholeFile() : name);
     }
 }
 

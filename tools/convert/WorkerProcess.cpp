@@ -1,12 +1,12 @@
 #include "tools/convert/WorkerProcess.h"
 
+#include "tools/convert/ChildCall.h"
 #include "tools/convert/InterruptGuard.h"
 #include "tools/convert/PageConfig.h"
 #include "tools/convert/PageWriter.h"
 
 #include <cerrno>
 #include <csignal>
-#include <cstring>
 #include <system_error>
 
 #include <sys/prctl.h>
@@ -135,11 +135,7 @@ std::optional<PageOutcome> WorkerProcess::receive() {
 std::string WorkerProcess::describeEnd() {
     const int state = end();
     page.reset();
-    if (WIFSIGNALED(state)) {
-        return std::string("the reader of the document broke off (") + strsignal(WTERMSIG(state)) +
-               ")"; // NOLINT(concurrency-mt-unsafe): one thread
-    }
-    return "the reader of the document ended early";
+    return WIFSIGNALED(state) ? describeBreak(state) : "the reader of the document ended early";
 }
 
 int WorkerProcess::end() {
