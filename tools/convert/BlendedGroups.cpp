@@ -15,7 +15,8 @@ constexpr int colorCount = 3;
 constexpr int roundingError = 1; // between two ways to the same colour
 
 const unsigned char* findPixel(const fz_pixmap* pixels, int x, int y) {
-    return pixels->samples + (y - pixels->y) * pixels->stride + (x - pixels->x) * pixels->n;
+    return pixels->samples + std::ptrdiff_t{y - pixels->y} * pixels->stride +
+           std::ptrdiff_t{x - pixels->x} * pixels->n;
 }
 
 bool isSamePixel(const fz_pixmap* one, const fz_pixmap* other, int x, int y) {
@@ -131,11 +132,9 @@ fz_pixmap* BlendedGroups::drawPage(std::size_t number, CUT kind) const {
         fz_run_page(ctx, run.page, device, run.matrix, run.cookie);
         fz_close_device(ctx, device);
     }
-    fz_always(ctx) {
-        fz_drop_device(ctx, device);
-        active = nullptr;
-    }
+    fz_always(ctx) { fz_drop_device(ctx, device); }
     fz_catch(ctx) { cut.isDone = false; }
+    active = nullptr;
     if (!cut.isDone) {
         fz_drop_pixmap(ctx, pixels);
         return nullptr;
