@@ -54,6 +54,10 @@ void copyChange(const fz_pixmap* before, const fz_pixmap* after, fz_pixmap* targ
     }
 }
 
+bool isSame(const fz_rect& one, const fz_rect& other) {
+    return one.x0 == other.x0 && one.y0 == other.y0 && one.x1 == other.x1 && one.y1 == other.y1;
+}
+
 /// Has the device take part in what opens and closes, but draw nothing more.
 void stopDrawing(fz_device* device) {
     device->fill_path = nullptr;
@@ -72,6 +76,7 @@ void stopDrawing(fz_device* device) {
 /// What the device that draws is to do otherwise.
 struct BlendedGroups::Cut {
     std::size_t number;
+    fz_rect area;
     CUT kind;
     decltype(fz_device::begin_group) beginGroup = nullptr; // of the renderer
     decltype(fz_device::end_group) endGroup = nullptr;
@@ -88,7 +93,7 @@ void BlendedGroups::beginGroup(fz_context* ctx, fz_device* device, fz_rect area,
                                float alpha) {
     Cut& cut = *active;
     const bool isBlended = blendMode != FZ_BLEND_NORMAL;
-    const bool isWanted = isBlended && cut.seen == cut.number;
+    const bool isWanted = isBlended && cut.seen == cut.number && isSame(area, cut.area);
     cut.seen += isBlended ? 1 : 0;
     if (isWanted) {
         cut.cutDepth = cut.depth;
@@ -114,8 +119,8 @@ void BlendedGroups::endGroup(fz_context* ctx, fz_device* device) {
     cut.endGroup(ctx, device);
 }
 
-fz_pixmap* BlendedGroups::drawPage(std::size_t number, CUT kind) const {
-    Cut cut{number, kind};
+fz_pixmap* BlendedGroups::drawPage(CUT kind) const {
+    Cut cut{wanted, wantedArea, kind};
     active = &cut;
     fz_pixmap* pixels = nullptr;
     fz_device* device = nullptr;
@@ -142,21 +147,23 @@ fz_pixmap* BlendedGroups::drawPage(std::size_t number, CUT kind) const {
     return pixels;
 }
 
-BLENDING BlendedGroups::draw(std::size_t number, const fz_rect& area, int dpi,
-                             PlacedPixels& picture) {
-    const float side = std::max({area.x1 - area.x0, area.y1 - area.y0, 1.0F});
+BLENDING BlendedGroups::draw(std::size_t number, const fz_rect& area, const fz_rect& visible,
+                             int dpi, PlacedPixels& picture) {
+    wanted = number;
+    wantedArea = area;
+    const float side = std::max({visible.x1 - visible.x0, visible.y1 - visible.y0, 1.0F});
     scale = std::min(static_cast<float>(dpi) / pointsPerInch, maxSide / side);
-    box = fz_round_rect(fz_transform_rect(area, fz_scale(scale, scale)));
+    box = fz_round_rect(fz_transform_rect(visible, fz_scale(scale, scale)));
     if (!run.page || fz_is_empty_irect(box)) {
         return run.page ? BLENDING_NONE : BLENDING_UNKNOWN;
     }
-    fz_pixmap* behind = drawPage(number, CUT_BEHIND);
-    fz_pixmap* plain = behind ? drawPage(number, CUT_BEHIND_PLAIN) : nullptr;
+    fz_pixmap* behind = drawPage(CUT_BEHIND);
+    fz_pixmap* plain = behind ? drawPage(CUT_BEHIND_PLAIN) : nullptr;
     BLENDING result = BLENDING_UNKNOWN;
     if (plain && fz_is_empty_irect(findChange(behind, plain))) {
         result = BLENDING_NONE;
     } else if (plain) {
-        fz_pixmap* before = drawPage(number, CUT_BEFORE);
+        fz_pixmap* before = drawPage(CUT_BEFORE);
         result = before ? compare(before, behind, picture) : BLENDING_UNKNOWN;
         fz_drop_pixmap(ctx, before);
     }

@@ -30,8 +30,10 @@ public:
     BlendedGroups(fz_context* context, const PageRun& pageRun) : ctx(context), run(pageRun) {}
 
     /// Draws the group `number`, counted from 0 among those of the page that have a blend mode.
-    /// Shape: `area`, where it is in the document; `picture`, all that it changes there, opaque.
-    BLENDING draw(std::size_t number, const fz_rect& area, int dpi, PlacedPixels& picture);
+    /// Shape: `area`, as the group was begun with, by which it is known again; `visible`, the part
+    /// to draw; `picture`, all that the group changes there, opaque.
+    BLENDING draw(std::size_t number, const fz_rect& area, const fz_rect& visible, int dpi,
+                  PlacedPixels& picture);
 
 private:
     /// How far the page is drawn.
@@ -47,13 +49,15 @@ private:
                            int isolated, int knockout, int blendMode, float alpha);
     static void endGroup(fz_context* ctx, fz_device* device);
 
-    fz_pixmap* drawPage(std::size_t number, CUT kind) const;
+    fz_pixmap* drawPage(CUT kind) const;
     BLENDING compare(fz_pixmap* before, fz_pixmap* behind, PlacedPixels& picture) const;
 
     static thread_local Cut* active; // MuPDF's own device has no room for one
 
     fz_context* ctx;
     PageRun run;
+    std::size_t wanted = 0; // number of the group
+    fz_rect wantedArea{};
     fz_irect box{}; // of the picture, in pixels
     float scale = 1;
 };

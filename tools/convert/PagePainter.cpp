@@ -334,13 +334,15 @@ void PagePainter::beginGroup(const fz_rect& area, bool isKnockout, int blendMode
 }
 
 bool PagePainter::drawBlended(std::size_t number, const fz_rect& area) {
-    constexpr std::size_t maxPictures = 32; // as each draws the page anew
+    constexpr std::size_t maxPictures = 32;
+    constexpr std::int64_t maxWork = 200'000; // elements, as each picture draws the page anew
     PlacedPixels picture;
     BLENDING blending = BLENDING_UNKNOWN;
-    if (layers.isOnPage() && pictureCount < maxPictures) {
+    if (layers.isOnPage() && pictureCount < maxPictures && pictureWork < maxWork) {
         ++pictureCount;
-        blending =
-            blended.draw(number, intersect(area, layers.getVisible()), options.shadeDpi, picture);
+        pictureWork += canvas.getElementCount();
+        blending = blended.draw(number, area, intersect(area, layers.getVisible()),
+                                options.shadeDpi, picture);
     }
     if (blending != BLENDING_PICTURE) {
         if (blending == BLENDING_UNKNOWN) {

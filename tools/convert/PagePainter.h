@@ -119,6 +119,7 @@ private:
     BlendedGroups blended;
     std::size_t blendedCount = 0; // of groups with a blend mode up to now
     std::size_t pictureCount = 0;
+    std::int64_t pictureWork = 0;
     int skippedGroups = 0; // open, of which the outermost is drawn as a picture
     std::vector<OpenGroup> groups;
     PathData current; // kept for its memory
