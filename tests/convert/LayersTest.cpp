@@ -154,6 +154,18 @@ TEST(Layers, WhatComesBehindAPictureIsDrawnAgain) {
     EXPECT_EQ(DrawnPage(source).count("rect"), 2);
 }
 
+TEST(Layers, TextInAPictureCanBeSearchedFor) {
+    PageSource source = makeBlended("Multiply", "1 0 0 rg 30 30 100 50 re f");
+    source.content += " BT /T 20 Tf 40 40 Td (Hello) Tj ET";
+    source.resources += "/Font<</T<</Type/Font/Subtype/Type1/BaseFont/Helvetica>>>>";
+    DrawmereConvert::ConvertOptions options;
+    options.textMode = DrawmereConvert::TEXTMODE_PLAIN;
+    const DrawnPage page(source, options);
+    EXPECT_EQ(countBlended(page), 2);
+    EXPECT_THAT(page.body(), HasSubstr("Hello"));
+    EXPECT_THAT(page.body(), HasSubstr("fill=\"none\""));
+}
+
 TEST(Layers, BlendModesInAPatternAreCounted) {
     const DrawnPage page({"/Pattern cs /P scn 10 10 80 80 re f",
                           "/Pattern<</P 5 0 R>>",

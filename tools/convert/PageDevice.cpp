@@ -75,10 +75,15 @@ void clipPath(fz_context* ctx, fz_device* device, const fz_path* path, int isEve
           [&](PagePainter& painter) { painter.clipPath(path, isEvenOdd != 0, matrix); });
 }
 
+// Text in a picture can be searched for, too.
 void fillText(fz_context* ctx, fz_device* device, const fz_text* text, fz_matrix matrix,
               fz_colorspace* space, const float* color, float alpha, fz_color_params params) {
-    paint(ctx, device, [&](PagePainter& painter) {
-        painter.fillText(*text, matrix, {painter.colors.convert(space, color, alpha, params)});
+    handOn(ctx, device, [&](PagePainter& painter) {
+        if (painter.isSkipping()) {
+            painter.ignoreText(*text, matrix);
+        } else {
+            painter.fillText(*text, matrix, {painter.colors.convert(space, color, alpha, params)});
+        }
     });
 }
 
