@@ -73,6 +73,8 @@ target_include_directories(drawmere INTERFACE
     $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/include>
     $<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}/drawmere>
 )
+# Nobody puts other functions in the place of the library's own, so calls among them go straight.
+target_link_options(drawmere PRIVATE -Wl,-Bsymbolic-functions)
 # The runtimes of the sanitizers come with the program, so only a plain build can ask for this.
 if(NOT DRAWMERE_SANITIZE)
     target_link_options(drawmere PRIVATE -Wl,--no-undefined)

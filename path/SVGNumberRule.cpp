@@ -3,6 +3,7 @@
 #include "foundation/common/MoxDigits.h"
 
 #include <algorithm>
+#include <array>
 #include <charconv>
 #include <cmath>
 #include <cstdint>
@@ -23,6 +24,9 @@ constexpr float wholeFrom = 16777216.0F;
 constexpr float hugeFrom = 9.0e18F;
 
 constexpr float zeroLimit = MoxLength(0.001F, MOXUNIT_MM).getRawValue();
+
+/// Whole numbers from here on have more than three digits.
+constexpr float shortFrom = 1000.0F;
 
 /// Below this the digits before the point are at most three.
 constexpr double shortThousandths = 1.0e6;
@@ -61,6 +65,32 @@ template <typename Char> Char* writeHuge(float magnitude, Char* out) {
     return std::copy(static_cast<const char*>(digits), end, out);
 }
 
+/// The text of a whole number below a thousand.
+struct ShortText {
+    char digits[3];
+    std::uint8_t length;
+};
+
+constexpr std::array<ShortText, 1000> shortTexts = [] {
+    std::array<ShortText, 1000> texts = {};
+    for (std::size_t i = 0; i < texts.size(); ++i) {
+        const std::size_t zeros = (i < 100 ? 1 : 0) + (i < 10 ? 1 : 0);
+        for (std::size_t k = zeros; k < 3; ++k) {
+            texts[i].digits[k - zeros] = digitTriples[3 * i + k];
+        }
+        texts[i].length = static_cast<std::uint8_t>(3 - zeros);
+    }
+    return texts;
+}();
+
+template <typename Char> Char* writeShortWhole(std::uint32_t whole, Char* out) {
+    const ShortText& text = shortTexts[whole];
+    out[0] = static_cast<Char>(text.digits[0]);
+    out[1] = static_cast<Char>(text.digits[1]);
+    out[2] = static_cast<Char>(text.digits[2]);
+    return out + text.length;
+}
+
 template <typename Char> Char* writeMagnitude(float magnitude, Char* out) {
     if (magnitude >= wholeFrom) {
         return magnitude < hugeFrom ? writeWhole(static_cast<std::uint64_t>(magnitude), out)
@@ -81,12 +111,20 @@ template <typename Char> Char* writeMagnitude(float magnitude, Char* out) {
 bool isRuleZero(MoxLength length) { return std::abs(length.getRawValue()) <= zeroLimit; }
 
 template <typename Char> Char* writeRuleDigits(float value, Char* out) {
-    if (!std::isfinite(value)) {
+    const float magnitude = std::abs(value);
+    *out = '-'; // overwritten unless the number is negative
+    Char* const digits = out + (std::signbit(value) ? 1 : 0);
+    // Most numbers of path data in small units are short and whole. A NaN fails the comparison.
+    if (magnitude < shortFrom) {
+        const auto whole = static_cast<std::uint32_t>(static_cast<std::int32_t>(magnitude));
+        if (static_cast<float>(whole) == magnitude) {
+            return writeShortWhole(whole, digits);
+        }
+    } else if (!std::isfinite(value)) {
         *out = '0';
         return out + 1;
     }
-    *out = '-'; // overwritten unless the number is negative
-    return writeMagnitude(std::abs(value), out + (std::signbit(value) ? 1 : 0));
+    return writeMagnitude(magnitude, digits);
 }
 
 template <typename Char> Char* writeRuleNumber(MoxLength length, Char* out) {

@@ -1,6 +1,9 @@
 #include "path/SVGPathManager.h"
 
+#include "foundation/common/MoxByteBlock.h"
+
 #include <algorithm>
+#include <cstdint>
 #include <cstdlib>
 #include <cstring>
 #include <new>
@@ -47,6 +50,21 @@ private:
     MoxPointT<MoxLength> current;
 };
 
+/// Returns: whether all bytes are ASCII, as they are unless a caller brings segments of its own.
+bool isPlain(std::string_view text) {
+    constexpr std::uint64_t highBits = 0x8080808080808080;
+    std::uint64_t seen = 0;
+    for (; text.size() >= sizeof(seen); text.remove_prefix(sizeof(seen))) {
+        std::uint64_t eight = 0;
+        std::memcpy(&eight, text.data(), sizeof(eight));
+        seen |= eight;
+    }
+    for (const char byte : text) {
+        seen |= static_cast<unsigned char>(byte);
+    }
+    return (seen & highBits) == 0;
+}
+
 } // namespace
 
 /// Path data in the making. Usual paths fit into the object; a longer text moves to the heap, where
@@ -67,6 +85,22 @@ public:
     }
 
     std::string_view get() const { return {begin, static_cast<std::size_t>(cursor - begin)}; }
+
+    /// Returns: the text as a value, null for none; what is long and plain is not copied. Ends the
+    /// use of this.
+    MoxValue take() {
+        const std::string_view text = get();
+        if (text.empty()) {
+            return {};
+        }
+        if (!heap || !isPlain(text)) {
+            return MoxValue::fromAscii(text);
+        }
+        void* const shrunk = std::realloc(heap, text.size());
+        MoxCommonNS::MoxByteBlock block(shrunk ? static_cast<char*>(shrunk) : heap);
+        heap = nullptr;
+        return MoxValue::adoptAscii(std::move(block), 0, text.size());
+    }
 
 private:
     void grow() {
@@ -132,7 +166,7 @@ MoxValue SVGPathManager::takePathData() {
     if (!raw.isEmpty()) {
         return raw;
     }
-    return text.get().empty() ? MoxValue() : MoxValue::fromAscii(text.get());
+    return text.take();
 }
 
 void SVGPathManager::writeSegments(PathText& text) {
@@ -140,12 +174,12 @@ void SVGPathManager::writeSegments(PathText& text) {
     Segments taken = std::exchange(segments, {});
     const bool isRelative = taken.front()->drawName == DRAWELEMENT_MOVE;
     RelativePen pen(*taken.front());
-    text.append(*taken.front());
-    for (std::size_t i = 1; i < taken.size(); ++i) {
-        if (isRelative) {
+    for (std::size_t i = 0; i < taken.size(); ++i) {
+        if (isRelative && i > 0) {
             pen.step(*taken[i]);
         }
         text.append(*taken[i]);
+        taken[i] = nullptr; // while it is at hand: a long path is larger than the processor's cache
     }
 }
 

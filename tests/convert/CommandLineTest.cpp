@@ -18,12 +18,12 @@ TEST(CommandLine, HelpListsEveryOptionAndShowsExamples) {
     const CommandResult result = Conversion().run({"--help"});
     EXPECT_EQ(result.status, 0);
     for (const char* const word :
-         {"--output",       "--pages",        "--number-format", "--keep-number", "--single-file",
-          "--index",        "--profile",      "--text",          "--gzip",        "--password",
-          "--images",       "--image-format", "--dpi",           "--quality",     "--shading-dpi",
-          "--small-device", "--max-size",     "--error-svg",     "--jobs",        "--timeout",
-          "--max-memory",   "--verbose",      "--quiet",         "--version",     "Examples:",
-          "Exit status"}) {
+         {"--output",      "--pages",        "--number-format", "--keep-number", "--single-file",
+          "--index",       "--profile",      "--text",          "--precision",   "--gzip",
+          "--password",    "--images",       "--image-format",  "--dpi",         "--quality",
+          "--shading-dpi", "--small-device", "--max-size",      "--error-svg",   "--jobs",
+          "--timeout",     "--max-memory",   "--verbose",       "--quiet",       "--version",
+          "Examples:",     "Exit status"}) {
         EXPECT_THAT(result.output, HasSubstr(word));
     }
 }
@@ -47,6 +47,7 @@ const Misuse misuses[] = {
     {{"a.pdf", "--pages", "7"}, "a.pdf: none of the pages asked for is among its 2"},
     {{"a.pdf", "--profile", "huge"}, "--profile"},
     {{"a.pdf", "--text", "letters"}, "--text"},
+    {{"a.pdf", "--precision", "0"}, "--precision"},
     {{"a.pdf", "--images", "some"}, "--images"},
     {{"a.pdf", "--image-format", "bmp"}, "--image-format"},
     {{"a.pdf", "--dpi", "0"}, "--dpi"},

@@ -48,9 +48,92 @@ TEST(OutlineText, RunsOfOneColourAreOnePath) {
 
 TEST(OutlineText, LongRunsAreWrittenInWholeNumbers) {
     const DrawnPage page = drawText("(Hello) Tj", TEXTMODE_OUTLINES);
-    EXPECT_EQ(page.attribute("path", "transform"), "scale(0.01,0.01)");
+    EXPECT_EQ(page.attribute("path", "transform"), "scale(0.02,0.02)");
     EXPECT_EQ(page.attribute("path", "d").find('.'), std::string::npos);
     EXPECT_EQ(drawText("(I) Tj", TEXTMODE_OUTLINES).attribute("path", "transform"), "(none)");
+}
+
+std::string scaleOf(const std::string& operators, float precision) {
+    ConvertOptions options;
+    options.precision = precision;
+    return DrawnPage({"BT " + operators + " (Hello) Tj ET", helvetica}, options)
+        .attribute("path", "transform");
+}
+
+TEST(OutlineText, TheGridFollowsThePrecisionAndIsFinerForSmallText) {
+    EXPECT_EQ(scaleOf("/F 20 Tf", 0.1F), "scale(0.2,0.2)");
+    EXPECT_EQ(scaleOf("/F 20 Tf", 0.001F), "scale(0.002,0.002)");
+    EXPECT_EQ(scaleOf("/F 4 Tf", 0.01F), "scale(0.01,0.01)");
+    EXPECT_EQ(scaleOf("/F 0.1 Tf", 0.01F), "scale(0.00125,0.00125)");
+    EXPECT_EQ(scaleOf("/F 0.1 Tf", 0.001F), "scale(0.000125,0.000125)");
+}
+
+/// Returns: the path data from each move to the next, without the places of the moves.
+std::vector<std::string> shapesOf(const std::string& data) {
+    std::vector<std::string> shapes;
+    for (std::size_t move = 0; move != std::string::npos;) {
+        const std::size_t next = data.find('m', move + 1);
+        const std::string subpath = data.substr(move, next - move);
+        const std::size_t shape = subpath.find_first_of("chlqv");
+        shapes.push_back(shape == std::string::npos ? "" : subpath.substr(shape));
+        move = next;
+    }
+    return shapes;
+}
+
+TEST(OutlineText, AGlyphHasTheSameTextWhereverItStands) {
+    const DrawnPage page =
+        drawText("(n) Tj 3.137 -7.773 Td (nnn) Tj 30 0 Td (n) Tj", TEXTMODE_OUTLINES);
+    const std::vector<std::string> shapes = shapesOf(page.attribute("path", "d"));
+    ASSERT_EQ(shapes.size(), 5);
+    EXPECT_THAT(shapes, testing::Each(shapes[0]));
+    EXPECT_FALSE(shapes[0].empty());
+}
+
+TEST(OutlineText, TextOfOneColourIsOnePathAcrossOtherText) {
+    EXPECT_EQ(
+        drawText("(Hello) Tj 1 0 0 rg (there) Tj 0 g (again) Tj", TEXTMODE_OUTLINES).count("path"),
+        2);
+}
+
+TEST(OutlineText, WhatIsDrawnOverTextStaysOverIt) {
+    const std::string text = "BT /F 20 Tf 10 40 Td (Hello) Tj ET ";
+    const auto draw = [&](const std::string& box) {
+        return DrawnPage({text + "1 0 0 rg " + box + " re f 0 g " + text, helvetica});
+    };
+    const DrawnPage over = draw("20 40 5 5");
+    EXPECT_EQ(over.count("path"), 2);
+    EXPECT_LT(over.svg.find("<path"), over.svg.find("<rect"));
+    EXPECT_LT(over.svg.find("<rect"), over.svg.rfind("<path"));
+    const DrawnPage beside = draw("20 80 5 5");
+    EXPECT_EQ(beside.count("path"), 1);
+}
+
+TEST(OutlineText, TextOverTextStaysOverIt) {
+    const DrawnPage page =
+        drawText("(Hello) Tj 1 0 0 rg 1 0 Td (Hello) Tj 0 g 1 0 Td (Hello) Tj", TEXTMODE_OUTLINES);
+    EXPECT_EQ(page.count("path"), 3);
+}
+
+TEST(OutlineText, ClearTextIsNotJoined) {
+    ConvertOptions options;
+    const DrawnPage page(
+        {"/G gs BT /F 20 Tf 10 40 Td (Hello) Tj ET BT /F 20 Tf 10 20 Td (Hello) Tj ET",
+         helvetica + "/ExtGState<</G<</ca 0.5>>>>"},
+        options);
+    EXPECT_EQ(page.count("path"), 2);
+}
+
+TEST(OutlineText, TextThatIsFilledAndStrokedIsOneElement) {
+    const DrawnPage page = drawText("2 Tr 1 0 0 RG (Hello) Tj", TEXTMODE_OUTLINES);
+    EXPECT_EQ(page.count("path"), 1);
+    EXPECT_EQ(page.attribute("path", "stroke"), "red");
+    EXPECT_THAT(page.attribute("path", "d"), testing::EndsWith("z"));
+}
+
+TEST(OutlineText, AStrokeOverTextComesBehindIt) {
+    const DrawnPage page({"BT /F 20 Tf 10 40 Td (Hello) Tj ET 3 w 10 37 m 60 37 l S", helvetica});
+    EXPECT_LT(page.svg.find("<path"), page.svg.find("<line"));
 }
 
 TEST(TextWriter, TextThatFollowsItsFontHasOnePosition) {

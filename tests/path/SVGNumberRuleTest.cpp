@@ -85,6 +85,15 @@ constexpr DigitsRow digitsRows[] = {
     {1.0e20F, "100000002004087734272"},
 };
 
+TEST(SVGNumberRule, WholeNumbersAreWrittenAsSuch) {
+    for (int number = -1100; number <= 1100; ++number) {
+        const std::string text = number == 0 ? "0" : std::to_string(number);
+        EXPECT_EQ(digitsOf(static_cast<float>(number)), text);
+        char16_t wide[maxRuleText];
+        EXPECT_EQ(narrowed(wide, writeRuleDigits(static_cast<float>(number), wide)), text);
+    }
+}
+
 TEST(SVGNumberRule, DigitsAreThreeDecimalsWithoutTheZerosThatSayNothing) {
     for (const DigitsRow& row : digitsRows) {
         EXPECT_EQ(digitsOf(row.value), row.text);

@@ -212,6 +212,27 @@ TEST(SVGPathManager, APathLongerThanTheFirstRoomIsWhole) {
     EXPECT_EQ(path.manager.takePathData().getAsciiText(), expected);
 }
 
+TEST(SVGPathManager, BytesOfOtherSegmentsAreCharactersInALongPathToo) {
+    struct Foreign : SVGDrawElement {
+        Foreign() : SVGDrawElement('X') {}
+
+        char* writeText(char* out) const override {
+            *out = '\xE4';
+            return out + 1;
+        }
+    };
+
+    Path path;
+    path.move(0, 0);
+    for (int i = 1; i <= 20'000; ++i) {
+        path.line(1, static_cast<float>(i));
+    }
+    path.add(MoxPtr<SVGDrawElement>(new Foreign));
+    const UnicodeString text = path.manager.takePathData().toString();
+    EXPECT_EQ(text.charAt(text.length() - 1), u'\u00E4');
+    EXPECT_EQ(text.charAt(0), u'M');
+}
+
 TEST(SVGPathManager, RawTextAloneIsTheDataUnchanged) {
     Path path;
     path.manager.addPathSeg(u"A1 2 0 0 1 5 6", true);

@@ -1,6 +1,8 @@
 #include "tools/convert/Canvas.h"
 
-#include <cmath>
+#include "tools/convert/Strokes.h"
+
+#include <optional>
 #include <utility>
 
 namespace DrawmereConvert {
@@ -9,13 +11,7 @@ namespace {
 constexpr std::size_t minScaledPoints = 40;
 constexpr MoxColor white(255, 255, 255);
 
-constexpr std::size_t maxTextPoints = 20000; // no viewer likes endless paths
-
-MoxPointT<MoxLength> place(const fz_point& point, float scale) {
-    return scale == 1 ? MoxPointT<MoxLength>(pt(point.x), pt(point.y))
-                      : MoxPointT<MoxLength>(pt(std::rint(point.x * scale)),
-                                             pt(std::rint(point.y * scale)));
-}
+MoxPointT<MoxLength> place(const fz_point& point) { return {pt(point.x), pt(point.y)}; }
 
 MoxRectT<MoxLength> place(const fz_rect& rect) {
     return {pt(rect.x0), pt(rect.y0), pt(rect.x1), pt(rect.y1)};
@@ -34,67 +30,79 @@ SVGMatrix toMatrix(const fz_matrix& matrix) {
 }
 
 void Canvas::fill(const PathData& path, bool isEvenOdd, const Paint& paint) {
-    flush();
-    wait(path, isEvenOdd, /*isText=*/false, paint);
-}
-
-void Canvas::fillText(const PathData& path, const Paint& paint) {
-    const bool joins = waiting.isText && !waiting.path.isEmpty() && waiting.paint == paint &&
-                       !paint.color.hasAlpha() && waiting.path.points.size() < maxTextPoints &&
-                       effects == Effects();
-    if (joins) {
-        waiting.path.append(path);
-        return;
-    }
-    flush();
-    wait(path, /*isEvenOdd=*/false, /*isText=*/true, paint);
-}
-
-void Canvas::wait(const PathData& path, bool isEvenOdd, bool isText, const Paint& paint) {
+    flushFill();
+    fillNow(texts.takeTouching(path.getBounds()));
     waiting.path = path;
     waiting.isEvenOdd = isEvenOdd;
-    waiting.isText = isText;
     waiting.paint = paint;
 }
 
+void Canvas::fillText(const GlyphRun& run, const Paint& paint) {
+    flushFill();
+    const bool joins = !paint.color.hasAlpha() && effects == Effects();
+    fillNow(texts.add(run, paint, joins));
+}
+
 void Canvas::flush() {
+    flushFill();
+    if (!texts.isEmpty()) {
+        fillNow(texts.takeAll());
+    }
+}
+
+void Canvas::flushFill() {
     if (waiting.path.isEmpty()) {
         return;
     }
     settings.setFill(waiting.paint);
     settings.setNoStroke();
-    if (isWorthScaling()) {
-        drawScaled();
-    } else {
-        drawShape(waiting.path, waiting.isEvenOdd, PAINTMODE_FILL);
-    }
+    drawShape(waiting.path, waiting.isEvenOdd, PAINTMODE_FILL);
     waiting.path.clear();
 }
 
-/// Returns: whether outlines of text are shorter with a matrix and whole numbers. A paint or mask
-/// would go through the matrix too, and lesser profiles have no room for such numbers.
-bool Canvas::isWorthScaling() const {
-    return waiting.isText && waiting.path.points.size() >= minScaledPoints &&
-           waiting.paint.id.isEmpty() && effects.mask.isEmpty() && getClipping() == CLIPPING_ALL;
+void Canvas::fillNow(const TextQueue::Texts& filled) {
+    for (const FilledText& text : filled) {
+        settings.setFill(text.paint);
+        settings.setNoStroke();
+        if (isWorthScaling(text)) {
+            drawScaled(text.run);
+        } else {
+            PathData path;
+            text.run.appendTo(path);
+            drawShape(path, /*isEvenOdd=*/false, PAINTMODE_FILL);
+        }
+    }
 }
 
-void Canvas::drawScaled() {
+/// Returns: whether text is shorter with a matrix and whole numbers. A paint or mask would go
+/// through the matrix too, and lesser profiles have no room for such numbers.
+bool Canvas::isWorthScaling(const FilledText& text) const {
+    return text.run.countPoints() >= minScaledPoints && text.paint.id.isEmpty() &&
+           effects.mask.isEmpty() && getClipping() == CLIPPING_ALL;
+}
+
+void Canvas::drawScaled(const GlyphRun& run) {
     ++elements;
     out.pushState();
     settings.save(/*isDefinition=*/false);
-    transform(fz_scale(1 / PathData::stepsPerPoint, 1 / PathData::stepsPerPoint));
+    transform(fz_scale(run.getStep(), run.getStep()));
     settings.setFillRule(FILLRULE_NONZERO);
-    drawPath(waiting.path, PAINTMODE_FILL, PathData::stepsPerPoint);
+    out.startPathData();
+    run.draw(out);
+    out.endPathData(PAINTMODE_FILL);
     out.popState();
     settings.restore();
 }
 
 void Canvas::stroke(const PathData& path, const Paint& paint, const Pen& pen) {
-    if (!waiting.path.isEmpty() && waiting.path == path) {
+    const fz_rect area = fz_expand_rect(path.getBounds(), getReach(pen));
+    if (isWaiting(path)) {
+        fillNow(texts.takeTouching(area));
         strokeWaiting(paint, pen);
         return;
     }
-    flush();
+    flushFill();
+    fillNow(texts.takeTouching(area));
     settings.setNoFill();
     settings.setStroke(paint, pen);
     if (!path.isLine()) {
@@ -106,6 +114,18 @@ void Canvas::stroke(const PathData& path, const Paint& paint, const Pen& pen) {
     beginElement();
     out.drawLine(pt(from.x), pt(from.y), pt(to.x), pt(to.y), PAINTMODE_STROKE);
     endElement();
+}
+
+/// Returns: whether what waits in `waiting`, perhaps because text was put there, is the same path.
+bool Canvas::isWaiting(const PathData& path) {
+    if (waiting.path.isEmpty()) {
+        const std::optional<FilledText> text = texts.takeEqual(path);
+        if (text) {
+            waiting = {path, /*isEvenOdd=*/false, text->paint};
+        }
+        return text.has_value();
+    }
+    return waiting.path == path;
 }
 
 void Canvas::strokeWaiting(const Paint& paint, const Pen& pen) {
@@ -193,7 +213,7 @@ void Canvas::endElement() {
     }
 }
 
-void Canvas::drawPath(const PathData& path, PAINTMODE mode, float scale) {
+void Canvas::drawPath(const PathData& path, PAINTMODE mode) {
     const bool isStroked = (mode & PAINTMODE_STROKE) != 0;
     const std::size_t count = path.steps.size();
     out.startPathData();
@@ -205,19 +225,20 @@ void Canvas::drawPath(const PathData& path, PAINTMODE mode, float scale) {
         switch (path.steps[i]) {
         case PATHSTEP_MOVE:
             start = point;
-            out.setPathMoveTo(place(*point++, scale));
+            out.setPathMoveTo(place(*point++));
             break;
         case PATHSTEP_LINE:
             // What closes goes back by itself.
             if (!closes || point->x != start->x || point->y != start->y) {
-                out.setPathLineTo(place(*point, scale));
+                out.setPathLineTo(place(*point));
             }
             ++point;
             break;
         case PATHSTEP_CURVE:
-            out.setPathCubicBezierCurveTo(place(point[0], scale), place(point[1], scale),
-                                          place(point[2], scale));
+            out.setPathCubicBezierCurveTo(place(point[0]), place(point[1]), place(point[2]));
             point += 3;
+            break;
+        case PATHSTEP_QUADRATIC: // a path has none
             break;
         case PATHSTEP_CLOSE:
             if (isStroked || !isLast) { // a fill closes by itself

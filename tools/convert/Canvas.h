@@ -3,6 +3,7 @@
 
 #include "tools/convert/PaintState.h"
 #include "tools/convert/PathData.h"
+#include "tools/convert/TextQueue.h"
 
 namespace DrawmereConvert {
 
@@ -27,8 +28,9 @@ struct Effects {
 
 /// Draws paths with what they need set, and opens and closes what contains others.
 ///
-/// A fill waits for the next call: a stroke of the same path makes one element with it, and a text
-/// in the same colour one path. Every other operation draws it first.
+/// A fill waits for the next call, as a stroke of the same path makes one element with it. Text
+/// waits longer, for more of its colour, until something is drawn over it. Every other operation
+/// draws both first.
 /// Throws: MoxError from the library.
 class Canvas {
 public:
@@ -37,7 +39,7 @@ public:
     void fill(const PathData& path, bool isEvenOdd, const Paint& paint);
 
     /// Fills the outlines of glyphs; those of several calls may become one path.
-    void fillText(const PathData& path, const Paint& paint);
+    void fillText(const GlyphRun& run, const Paint& paint);
 
     void stroke(const PathData& path, const Paint& paint, const Pen& pen);
 
@@ -76,7 +78,7 @@ public:
     void beginLink(const UnicodeString& uri, bool isNewWindow);
     void endLink();
 
-    /// Draws the fill that waits.
+    /// Draws what waits.
     void flush();
 
     /// To be called around an element that is drawn through `out`.
@@ -95,21 +97,23 @@ private:
     struct WaitingFill {
         PathData path; ///< empty when no fill waits
         bool isEvenOdd = false;
-        bool isText = false;
         Paint paint;
     };
 
-    void wait(const PathData& path, bool isEvenOdd, bool isText, const Paint& paint);
+    void flushFill();
+    void fillNow(const TextQueue::Texts& filled);
+    bool isWaiting(const PathData& path);
     void strokeWaiting(const Paint& paint, const Pen& pen);
     void strokeHiding(const Paint& paint, const Pen& pen);
     void drawShape(const PathData& path, bool isEvenOdd, PAINTMODE mode);
-    void drawPath(const PathData& path, PAINTMODE mode, float scale = 1);
-    bool isWorthScaling() const;
-    void drawScaled();
+    void drawPath(const PathData& path, PAINTMODE mode);
+    bool isWorthScaling(const FilledText& text) const;
+    void drawScaled(const GlyphRun& run);
     void saveDefinition();
     void restoreDefinition();
 
     WaitingFill waiting;
+    TextQueue texts;
     std::int64_t elements = 0;
     bool hidesFills = false;
     Effects effects;

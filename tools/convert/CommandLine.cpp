@@ -98,6 +98,10 @@ private:
                        "or plain (text with the names of its fonts)")
             ->transform(CLI::CheckedTransformer(textWords))
             ->option_text("WORD");
+        app.add_option("--precision", options.convert.precision,
+                       "Points by which outlines of text may be off, across and down (0.01): "
+                       "smaller for prints, larger for smaller pages")
+            ->check(CLI::Range(0.001, 1.0));
         app.add_flag("--gzip", options.gzip, "Compress the documents");
         app.add_option("--password", options.password, "Opens encrypted documents");
     }

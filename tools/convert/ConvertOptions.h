@@ -17,6 +17,7 @@ enum TEXTMODE : std::int32_t {
 /// The options of all pages. What the library itself decides stands in `SVGConfig`.
 struct ConvertOptions {
     TEXTMODE textMode = TEXTMODE_OUTLINES;
+    float precision = 0.01F; ///< how far outlines of text may be off, across and down, in points
     int shadeDpi = 144; ///< resolution of what can only be shown as an image, shading meshes mainly
 
     /// Images of more bytes go to a file beside the page, when the page goes to a file.

@@ -46,7 +46,7 @@ bool runPage(DocumentFile& file, PagePainter& painter, const fz_matrix& matrix) 
 
 DocumentConverter::DocumentConverter(const ConvertOptions& chosen)
     : options(chosen), file(std::make_unique<DocumentFile>(chosen)),
-      outlines(std::make_unique<GlyphOutlines>(file->ctx)),
+      outlines(std::make_unique<GlyphOutlines>(file->ctx, chosen.precision)),
       fonts(std::make_unique<FontBook>(file->ctx)) {}
 
 DocumentConverter::~DocumentConverter() = default;

@@ -1,8 +1,11 @@
 #include "tools/convert/GlyphOutlines.h"
 
 #include "tools/convert/FitzCall.h"
+#include "tools/convert/OutlineFitter.h"
+#include "tools/convert/Type3Outline.h"
 
-#include <algorithm>
+#include <bit>
+#include <cmath>
 #include <new>
 
 namespace DrawmereConvert {
@@ -60,9 +63,14 @@ void GlyphOutlines::trim() {
     for (const auto& font : fonts) {
         kept += font.second->data.points.size();
     }
+    for (const auto& grid : grids) {
+        kept += grid.second.countPoints();
+    }
     if (kept < maxKeptPoints) {
         return;
     }
+    grids.clear();
+    nextNumber = 0;
     for (const auto& font : fonts) {
         fz_drop_font(ctx, font.first);
     }
@@ -97,8 +105,42 @@ GlyphOutline GlyphOutlines::find(fz_font* font, int glyph) {
     if (!entry.isRead) {
         read(font, glyph, outlines, entry);
     }
-    return {outlines.data.steps.data() + entry.firstStep, entry.stepCount,
-            outlines.data.points.data() + entry.firstPoint, entry.isDrawing};
+    return outlines.get(entry);
+}
+
+GlyphOutline GlyphOutlines::findFitted(fz_font* font, int glyph, int toleranceSteps) {
+    FontOutlines& outlines = findFont(font);
+    const std::int64_t key = std::int64_t{toleranceSteps} * (maxGlyph + 1) + glyph;
+    const auto known = outlines.fitted.find(key);
+    if (known != outlines.fitted.end()) {
+        return outlines.get(known->second);
+    }
+    const GlyphOutline outline = find(font, glyph);
+    LooseOutline fitted;
+    fitOutline(outline, std::exp2(static_cast<float>(toleranceSteps) / 8), fitted);
+    Entry entry;
+    entry.firstStep = static_cast<std::uint32_t>(outlines.data.steps.size());
+    entry.firstPoint = static_cast<std::uint32_t>(outlines.data.points.size());
+    entry.stepCount = static_cast<std::uint32_t>(fitted.steps.size());
+    entry.isDrawing = outline.isDrawing;
+    outlines.data.steps.insert(outlines.data.steps.end(), fitted.steps.begin(), fitted.steps.end());
+    outlines.data.points.insert(outlines.data.points.end(), fitted.points.begin(),
+                                fitted.points.end());
+    outlines.fitted.emplace(key, entry);
+    return outlines.get(entry);
+}
+
+GridFont& GlyphOutlines::findGrid(fz_font* font, const fz_matrix& matrix) {
+    const GridKey key = {
+        font,
+        {std::bit_cast<std::uint32_t>(matrix.a), std::bit_cast<std::uint32_t>(matrix.b),
+         std::bit_cast<std::uint32_t>(matrix.c), std::bit_cast<std::uint32_t>(matrix.d)}};
+    const auto known = grids.find(key);
+    if (known != grids.end()) {
+        return known->second;
+    }
+    findFont(font); // keeps it
+    return grids.try_emplace(key, *this, font, matrix, precision).first->second;
 }
 
 void GlyphOutlines::read(fz_font* font, int glyph, FontOutlines& outlines, Entry& entry) {
@@ -150,6 +192,8 @@ bool GlyphOutlines::append(fz_font* font, int glyph, const fz_matrix& matrix, Pa
             path.curveTo(first.x, first.y, second.x, second.y, at.x, at.y);
             break;
         }
+        case PATHSTEP_QUADRATIC: // fonts are read without
+            break;
         case PATHSTEP_CLOSE:
             path.close();
             break;

@@ -1,30 +1,28 @@
 /// The outlines of glyphs, read once a font.
 #pragma once
 
-#include "tools/convert/PathData.h"
-#include "tools/convert/Type3Outline.h"
+#include "tools/convert/GlyphOutline.h"
+#include "tools/convert/GridFont.h"
 
 #include <mupdf/fitz.h>
 
+#include <array>
 #include <cstdint>
+#include <map>
 #include <memory>
 #include <unordered_map>
 #include <vector>
 
 namespace DrawmereConvert {
 
-/// The shape of one glyph, in units of the em. Borrowed from `GlyphOutlines`.
-struct GlyphOutline {
-    const PATHSTEP* steps = nullptr;
-    std::size_t stepCount = 0;
-    const fz_point* points = nullptr;
-    bool isDrawing = false; ///< it has no outline, as a Type 3 font draws it in other ways
-};
+class PathData;
 
 /// Reads outlines from fonts and keeps them, and the fonts, until `trim`.
 class GlyphOutlines {
 public:
-    explicit GlyphOutlines(fz_context* context) : ctx(context) {}
+    /// Shape: `largestError`, of `findGrid`, in points.
+    GlyphOutlines(fz_context* context, float largestError)
+        : ctx(context), precision(largestError) {}
 
     GlyphOutlines(const GlyphOutlines&) = delete;
     GlyphOutlines& operator=(const GlyphOutlines&) = delete;
@@ -33,6 +31,17 @@ public:
     /// Returns: the outline of a glyph, without steps for one that is blank or can't be read; good
     /// until the next call.
     GlyphOutline find(fz_font* font, int glyph);
+
+    /// Returns: the same, fitted so that nothing is farther off than `tolerance`, in units of the
+    /// em. Shape: the tolerance is 2 to the power of `toleranceSteps` eighths.
+    GlyphOutline findFitted(fz_font* font, int glyph, int toleranceSteps);
+
+    /// Returns: the font with outlines on a grid, for text drawn with `matrix`, whatever its shift;
+    /// good until `trim`.
+    GridFont& findGrid(fz_font* font, const fz_matrix& matrix);
+
+    /// Returns: the number of the next outline on a grid.
+    std::uint32_t takeNumber() { return nextNumber++; }
 
     /// Appends the outline of a glyph, with `matrix` applied, to `path`.
     /// Returns: false for a glyph that is a drawing.
@@ -52,7 +61,21 @@ private:
 
     struct FontOutlines {
         std::vector<Entry> entries; // by glyph
+        std::unordered_map<std::int64_t, Entry> fitted;
         LooseOutline data;
+
+        GlyphOutline get(const Entry& entry) const {
+            return {data.steps.data() + entry.firstStep, entry.stepCount,
+                    data.points.data() + entry.firstPoint, entry.isDrawing};
+        }
+    };
+
+    /// A font, and the four numbers of a matrix without its shift, as bits: so they have an order.
+    struct GridKey {
+        auto operator<=>(const GridKey&) const = default;
+
+        fz_font* font;
+        std::array<std::uint32_t, 4> matrix;
     };
 
     FontOutlines& findFont(fz_font* font);
@@ -60,9 +83,12 @@ private:
     void readFile(fz_font* font, int glyph, LooseOutline& data);
 
     fz_context* ctx;
+    float precision;
     std::unordered_map<fz_font*, std::unique_ptr<FontOutlines>> fonts; // the fonts are kept
     fz_font* lastFont = nullptr;
     FontOutlines* lastOutlines = nullptr; // borrowed from `fonts`
+    std::map<GridKey, GridFont> grids;
+    std::uint32_t nextNumber = 0;
 };
 
 } // namespace DrawmereConvert

@@ -1,30 +1,54 @@
 #include "tools/convert/OutlineText.h"
 
 namespace DrawmereConvert {
+namespace {
 
-void readOutlines(GlyphOutlines& outlines, const fz_text_span& span, const fz_matrix& matrix,
-                  PathData& path, std::vector<DrawnGlyph>& drawn) {
+/// Calls `take` with the number of each glyph and the matrix that places it in the text.
+template <class Take> void forEachGlyph(const fz_text_span& span, const Take& take) {
     fz_matrix place = span.trm;
     for (int i = 0; i < span.len; ++i) {
         const fz_text_item& item = span.items[i];
         if (item.gid >= 0) {
             place.e = item.x;
             place.f = item.y;
-            if (!outlines.append(span.font, item.gid, fz_concat(place, matrix), path)) {
-                drawn.push_back({span.font, item.gid, place});
-            }
+            take(item.gid, place);
         }
     }
 }
 
-std::vector<DrawnGlyph> readOutlines(GlyphOutlines& outlines, const fz_text& text,
-                                     const fz_matrix& matrix, PathData& path) {
+} // namespace
+
+void readRun(GridFont& grid, const fz_text_span& span, const fz_matrix& matrix, GlyphRun& run,
+             std::vector<DrawnGlyph>& drawn) {
+    forEachGlyph(span, [&](int glyph, const fz_matrix& place) {
+        const GridOutline& outline = grid.find(glyph);
+        if (outline.isDrawing) {
+            drawn.push_back({span.font, glyph, place});
+        } else {
+            run.add(outline, grid.getStep(), fz_transform_point_xy(place.e, place.f, matrix));
+        }
+    });
+}
+
+void readRuns(GlyphOutlines& outlines, const fz_text& text, const fz_matrix& matrix,
+              PathData& path) {
     std::vector<DrawnGlyph> drawn;
     for (const fz_text_span* span = text.head; span; span = span->next) {
-        readOutlines(outlines, *span, matrix, path, drawn);
+        GlyphRun run;
+        GridFont& grid = outlines.findGrid(span->font, fz_concat(span->trm, matrix));
+        readRun(grid, *span, matrix, run, drawn);
+        run.appendTo(path);
+    }
+}
+
+void readOutlines(GlyphOutlines& outlines, const fz_text& text, const fz_matrix& matrix,
+                  PathData& path) {
+    for (const fz_text_span* span = text.head; span; span = span->next) {
+        forEachGlyph(*span, [&](int glyph, const fz_matrix& place) {
+            outlines.append(span->font, glyph, fz_concat(place, matrix), path);
+        });
     }
     path.tidy();
-    return drawn;
 }
 
 } // namespace DrawmereConvert

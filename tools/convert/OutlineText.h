@@ -2,6 +2,7 @@
 #pragma once
 
 #include "tools/convert/GlyphOutlines.h"
+#include "tools/convert/GlyphRun.h"
 
 #include <mupdf/fitz.h>
 
@@ -16,12 +17,17 @@ struct DrawnGlyph {
     fz_matrix matrix = fz_identity; ///< from the em to the text
 };
 
-/// Appends the outlines of all glyphs of `span` to `path`, and to `drawn` the glyphs without one.
-void readOutlines(GlyphOutlines& outlines, const fz_text_span& span, const fz_matrix& matrix,
-                  PathData& path, std::vector<DrawnGlyph>& drawn);
+/// Appends the outlines of all glyphs of `span`, whose font is that of `grid`, to `run`, and to
+/// `drawn` the glyphs without one.
+void readRun(GridFont& grid, const fz_text_span& span, const fz_matrix& matrix, GlyphRun& run,
+             std::vector<DrawnGlyph>& drawn);
 
-/// The same for all of `text`. Returns: the glyphs without outline.
-std::vector<DrawnGlyph> readOutlines(GlyphOutlines& outlines, const fz_text& text,
-                                     const fz_matrix& matrix, PathData& path);
+/// Appends the outlines of all glyphs of `text` to `path`, as runs have them.
+void readRuns(GlyphOutlines& outlines, const fz_text& text, const fz_matrix& matrix,
+              PathData& path);
+
+/// Appends the outlines of all glyphs of `text` to `path`, as exact as a path can be.
+void readOutlines(GlyphOutlines& outlines, const fz_text& text, const fz_matrix& matrix,
+                  PathData& path);
 
 } // namespace DrawmereConvert

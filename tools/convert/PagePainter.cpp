@@ -35,8 +35,8 @@ PagePainter::PagePainter(fz_context* context, const ConvertOptions& chosen,
 
 // Paths.
 
-void PagePainter::noteLength(const PathData& path) {
-    if (path.points.size() > options.maxPathPoints) {
+void PagePainter::noteLength(std::size_t points) {
+    if (points > options.maxPathPoints) {
         report.note(APPROXIMATION_LIMIT);
     }
 }
@@ -47,7 +47,7 @@ void PagePainter::fillPath(const fz_path* path, bool isEvenOdd, const fz_matrix&
     readPath(ctx, path, layers.place(matrix), current);
     layers.cutByHand(current);
     if (!current.isEmpty() && layers.enter(current.getBounds())) {
-        noteLength(current);
+        noteLength(current.points.size());
         canvas.fill(current, isEvenOdd, paint);
     }
 }
@@ -71,7 +71,7 @@ void PagePainter::stroke(const fz_stroke_state& style, const StrokeMatrices& mat
     if (current.isEmpty() || !layers.enter(fz_transform_rect(bounds, matrices.document))) {
         return;
     }
-    noteLength(current);
+    noteLength(current.points.size());
     if (matrices.isPlain) {
         canvas.stroke(current, paint, pen);
         return;
@@ -87,7 +87,7 @@ void PagePainter::stroke(const fz_stroke_state& style, const StrokeMatrices& mat
 void PagePainter::clipPath(const fz_path* path, bool isEvenOdd, const fz_matrix& matrix) {
     current.clear();
     readPath(ctx, path, layers.place(matrix), current);
-    noteLength(current);
+    noteLength(current.points.size());
     layers.pushClip(current, isEvenOdd);
 }
 
@@ -105,14 +105,31 @@ void PagePainter::fillText(const fz_text& text, const fz_matrix& matrix, const P
         writeText(text, matrix, {PAINTMODE_FILL, paint});
         return;
     }
-    current.clear();
-    const std::vector<DrawnGlyph> drawn =
-        readOutlines(outlines, text, layers.place(matrix), current);
-    if (!current.isEmpty() && layers.enter(current.getBounds())) {
-        noteLength(current);
-        canvas.fillText(current, paint);
+    std::vector<DrawnGlyph> drawn;
+    for (const fz_text_span* span = text.head; span; span = span->next) {
+        readSpan(*span, matrix, paint, drawn);
     }
+    fillRun(paint);
     drawGlyphs(drawn, matrix, paint);
+}
+
+/// Takes up the outlines of a span, and fills those before it when their grid is another.
+void PagePainter::readSpan(const fz_text_span& span, const fz_matrix& matrix, const Paint& paint,
+                           std::vector<DrawnGlyph>& drawn) {
+    const fz_matrix placed = layers.place(matrix);
+    GridFont& grid = outlines.findGrid(span.font, fz_concat(span.trm, placed));
+    if (!run.accepts(grid.getStep())) {
+        fillRun(paint);
+    }
+    readRun(grid, span, placed, run, drawn);
+}
+
+void PagePainter::fillRun(const Paint& paint) {
+    if (!run.isEmpty() && layers.enter(run.getBounds())) {
+        noteLength(run.countPoints());
+        canvas.fillText(run, paint);
+    }
+    run.clear();
 }
 
 void PagePainter::writeText(const fz_text& text, const fz_matrix& matrix, const TextPaint& paint) {
@@ -120,13 +137,9 @@ void PagePainter::writeText(const fz_text& text, const fz_matrix& matrix, const 
         if (writeSpan(*span, matrix, paint)) {
             continue;
         }
-        current.clear();
         std::vector<DrawnGlyph> drawn;
-        readOutlines(outlines, *span, layers.place(matrix), current, drawn);
-        current.tidy();
-        if (!current.isEmpty() && layers.enter(current.getBounds())) {
-            canvas.fillText(current, paint.fill);
-        }
+        readSpan(*span, matrix, paint.fill, drawn);
+        fillRun(paint.fill);
         drawGlyphs(drawn, matrix, paint.fill);
     }
 }
@@ -192,7 +205,7 @@ void PagePainter::strokeText(const fz_text& text, const fz_stroke_state& style,
         writeText(text, matrix, {PAINTMODE_STROKE, {}, paint, toPen(style, matrices.penScale)});
         return;
     }
-    readOutlines(outlines, text, matrices.points, current);
+    readRuns(outlines, text, matrices.points, current); // to be equal to what is filled
     stroke(style, matrices, paint);
 }
 

@@ -85,7 +85,7 @@ public:
 
 private:
     /// Notes a path that is too long for some viewers.
-    void noteLength(const PathData& path);
+    void noteLength(std::size_t points);
     /// Splits `matrix` between the document and `current`, which is cleared.
     StrokeMatrices startStroke(const fz_matrix& matrix);
     void stroke(const fz_stroke_state& style, const StrokeMatrices& matrices, const Paint& paint);
@@ -93,6 +93,9 @@ private:
     bool writeSpan(const fz_text_span& span, const fz_matrix& matrix, const TextPaint& paint);
     void writeEntered(const TextSpan& text, const TextPaint& paint);
     void writeText(const fz_text& text, const fz_matrix& matrix, const TextPaint& paint);
+    void readSpan(const fz_text_span& span, const fz_matrix& matrix, const Paint& paint,
+                  std::vector<DrawnGlyph>& drawn);
+    void fillRun(const Paint& paint);
     void drawGlyphs(const std::vector<DrawnGlyph>& glyphs, const fz_matrix& matrix,
                     const Paint& paint);
     /// Puts the outline of a small mask into `current`. Returns: false for one that has none.
@@ -123,6 +126,7 @@ private:
     int skippedGroups = 0; // open, of which the outermost is drawn as a picture
     std::vector<OpenGroup> groups;
     PathData current; // kept for its memory
+    GlyphRun run;     // likewise
 };
 
 } // namespace DrawmereConvert

@@ -41,11 +41,6 @@ void PathData::close() {
     }
 }
 
-void PathData::append(const PathData& other) {
-    steps.insert(steps.end(), other.steps.begin(), other.steps.end());
-    points.insert(points.end(), other.points.begin(), other.points.end());
-}
-
 void PathData::tidy() {
     while (!steps.empty() && steps.back() == PATHSTEP_MOVE) {
         steps.pop_back();

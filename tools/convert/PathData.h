@@ -9,10 +9,11 @@
 namespace DrawmereConvert {
 
 enum PATHSTEP : std::uint8_t {
-    PATHSTEP_MOVE,  ///< one point
-    PATHSTEP_LINE,  ///< one point
-    PATHSTEP_CURVE, ///< three points: two controls and the end of a cubic curve
-    PATHSTEP_CLOSE, ///< no point
+    PATHSTEP_MOVE,      ///< one point
+    PATHSTEP_LINE,      ///< one point
+    PATHSTEP_CURVE,     ///< three points: two controls and the end of a cubic curve
+    PATHSTEP_CLOSE,     ///< no point
+    PATHSTEP_QUADRATIC, ///< two points, in outlines of glyphs alone: the control and the end
 };
 
 /// Built by the calls `moveTo` to `close`. Points are rounded to hundredths as they come in, since
@@ -31,7 +32,6 @@ public:
 
     void curveTo(float x1, float y1, float x2, float y2, float x, float y);
     void close();
-    void append(const PathData& other);
 
     /// Drops what draws nothing: moves that no segment follows.
     void tidy();

@@ -1,19 +1,9 @@
 /// The glyphs of Type 3 fonts, which are drawings, as outlines.
 #pragma once
 
-#include "tools/convert/PathData.h"
-
-#include <mupdf/fitz.h>
-
-#include <vector>
+#include "tools/convert/GlyphOutline.h"
 
 namespace DrawmereConvert {
-
-/// The steps of an outline with points that are not rounded.
-struct LooseOutline {
-    std::vector<PATHSTEP> steps;
-    std::vector<fz_point> points;
-};
 
 /// Appends to `outline` what a glyph draws, in units of the em. Bitmaps are traced.
 /// Returns: false, with nothing appended, for a glyph with colours of its own or with anything but
