@@ -74,7 +74,10 @@ private:
 /// the pen in the same way.
 class PackingOrder {
 public:
-    explicit PackingOrder(const std::vector<PlacedGlyph>& glyphs) {
+    PackingOrder(const std::vector<PlacedGlyph>& glyphs, std::size_t points) {
+        if (points * lettersInPoint <= deflateReach) {
+            return;
+        }
         std::size_t textLength = 0;
         for (std::size_t i = 0; i < glyphs.size(); ++i) {
             const GridOutline& outline = *glyphs[i].outline;
@@ -91,6 +94,9 @@ public:
     }
 
     bool isRare(const GridOutline& outline) const {
+        if (uses.empty()) {
+            return false;
+        }
         const Use& use = uses[outline.number];
         return use.timesForgotten * wayBack > use.count;
     }
@@ -251,7 +257,7 @@ bool GlyphRun::touches(const GlyphRun& other) const {
 
 void GlyphRun::draw(Drawmere& out) const {
     GridPen pen(out);
-    const PackingOrder order(glyphs);
+    const PackingOrder order(glyphs, points);
     std::vector<const PlacedGlyph*> rare;
     for (const PlacedGlyph& glyph : glyphs) {
         if (order.isRare(*glyph.outline)) {

@@ -109,6 +109,13 @@ struct Samples {
         }
     }
 
+    /// Goes along at the same speed everywhere.
+    void level() {
+        for (std::size_t i = 0; i < count; ++i) {
+            places[i] = lengths[i] / arcLength;
+        }
+    }
+
     /// Finds where `curve` comes closest to each. Returns: the largest distance.
     float measure(const Segment& curve) {
         float largest = 0;
@@ -120,6 +127,7 @@ struct Samples {
 
     std::array<Vector, std::size_t{maxJoined} * samplesPerCurve> points;
     std::array<float, std::size_t{maxJoined} * samplesPerCurve> places;
+    std::array<float, std::size_t{maxJoined} * samplesPerCurve> lengths; // of the way there
     std::size_t count = 0;
     float arcLength = 0;
 
@@ -142,6 +150,7 @@ private:
             arcLength += length(point - before);
             before = point;
             points[count] = point;
+            lengths[count] = arcLength;
             places[count++] = start + part * weight;
         }
     }
@@ -171,7 +180,14 @@ public:
     /// Returns: whether `result` became a curve that is close enough.
     bool find(Segment& result) {
         const bool isSound = samples.arcLength > tiny && std::isfinite(samples.arcLength);
-        return isSound && (findQuadratic(result) || findCubic(result));
+        if (!isSound) {
+            return false;
+        }
+        if (findQuadratic(result) || findCubic(result)) {
+            return true;
+        }
+        samples.level();
+        return findCubic(result);
     }
 
 private:
