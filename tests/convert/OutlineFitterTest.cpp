@@ -119,6 +119,17 @@ TEST(OutlineFitter, ACurveThatTurnsBackIsNoLine) {
     EXPECT_EQ(fit(spike).steps.back(), PATHSTEP_CURVE);
 }
 
+TEST(OutlineFitter, ACurveThatNothingReplacesStaysAsItIs) {
+    LooseOutline blunt{{PATHSTEP_MOVE}, {{0, 0}}};
+    curveTo(blunt, {0, 0}, {0.9F, 0.9F}, {0.9F, 0.2F}); // without a handle at one end
+    const LooseOutline fitted = fit(blunt, 0.00001F);
+    ASSERT_EQ(fitted.steps, blunt.steps);
+    for (std::size_t i = 0; i < fitted.points.size(); ++i) {
+        EXPECT_NEAR(fitted.points[i].x, blunt.points[i].x, 0.0001F) << i;
+        EXPECT_NEAR(fitted.points[i].y, blunt.points[i].y, 0.0001F) << i;
+    }
+}
+
 TEST(OutlineFitter, AQuadraticCurveIsFoundAgain) {
     LooseOutline raised{{PATHSTEP_MOVE}, {{0, 0}}};
     curveTo(raised, {0.2F, 0.4F}, {0.4F, 0.4F}, {0.6F, 0}); // of (0.3, 0.6)

@@ -289,12 +289,12 @@ public:
 
     void start(const Vector& point) {
         finish();
-        beginning = last = point;
+        beginning = pen = point;
     }
 
     void add(PATHSTEP step, const Vector& control1, const Vector& control2, const Vector& point) {
-        segments.push_back({step, {last, control1, control2, point}});
-        last = point;
+        segments.push_back({step, {pen, control1, control2, point}});
+        pen = point;
     }
 
     void finish() {
@@ -312,7 +312,7 @@ public:
 
     void close() {
         finish();
-        last = beginning;
+        pen = beginning;
     }
 
 private:
@@ -331,18 +331,22 @@ private:
         if (best.step == PATHSTEP_LINE || isFlat(best, tolerance)) {
             best.step = PATHSTEP_LINE;
         } else {
-            Joint(&segments[first], &segments[first], tolerance).find(best);
+            replace(first, first, best);
         }
-        while (canJoin(first, next)) {
-            Segment joined;
-            if (!Joint(&segments[first], &segments[next], tolerance).find(joined)) {
-                break;
-            }
-            best = joined;
+        while (canJoin(first, next) && replace(first, next, best)) {
             ++next;
         }
         write(best);
         return next;
+    }
+
+    bool replace(std::size_t first, std::size_t last, Segment& best) const {
+        Segment joined;
+        const bool isFound = Joint(&segments[first], &segments[last], tolerance).find(joined);
+        if (isFound) {
+            best = joined;
+        }
+        return isFound;
     }
 
     bool canJoin(std::size_t first, std::size_t next) const {
@@ -373,7 +377,7 @@ private:
     LooseOutline& fitted;
     std::vector<Segment> segments;
     Vector beginning{};
-    Vector last{};
+    Vector pen{};
 };
 
 } // namespace
