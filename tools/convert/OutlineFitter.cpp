@@ -22,17 +22,11 @@ constexpr float cosineOfHairpin = -0.9F;
 
 using Vector = fz_point;
 
-Vector operator+(const Vector& one, const Vector& other) {
-    return {one.x + other.x, one.y + other.y};
-}
+Vector operator+(const Vector& a, const Vector& b) { return {a.x + b.x, a.y + b.y}; }
 
-Vector operator-(const Vector& one, const Vector& other) {
-    return {one.x - other.x, one.y - other.y};
-}
+Vector operator-(const Vector& a, const Vector& b) { return {a.x - b.x, a.y - b.y}; }
 
-Vector operator*(float factor, const Vector& vector) {
-    return {factor * vector.x, factor * vector.y};
-}
+Vector operator*(float factor, const Vector& a) { return {factor * a.x, factor * a.y}; }
 
 float dot(const Vector& one, const Vector& other) { return one.x * other.x + one.y * other.y; }
 
