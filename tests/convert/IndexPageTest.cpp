@@ -3,6 +3,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <regex>
+
 namespace DrawmereTest {
 namespace {
 
@@ -22,17 +24,23 @@ TEST(IndexPage, EveryPageHasAPlaceOfItsSize) {
     const std::string page = makeIndexPage({makeDocument("a")});
     EXPECT_TRUE(isIndexPage(page));
     EXPECT_THAT(page, HasSubstr("<title>Title of a</title>"));
-    EXPECT_THAT(page,
-                HasSubstr("<section id=\"p1\" style=\"--w:200;--h:100\" data-file=\"a1.svg\">"));
-    EXPECT_THAT(page,
-                HasSubstr("<section id=\"p2\" style=\"--w:50.5;--h:100\" data-file=\"a3.svg\">"));
+    EXPECT_THAT(
+        page,
+        HasSubstr(
+            "<section id=\"p1\" role=\"group\" aria-label=\"Page 1\" style=\"--w:200;--h:100\" data-file=\"a1.svg\">"));
+    EXPECT_THAT(
+        page,
+        HasSubstr(
+            "<section id=\"p2\" role=\"group\" aria-label=\"Page 2\" style=\"--w:50.5;--h:100\" data-file=\"a3.svg\">"));
 }
 
 TEST(IndexPage, LinksLieWhereTheyAreOnThePage) {
     IndexDocument document = makeDocument("a");
     document.entries[0].links = {{20, 10, 100, 5, "a3.svg"}};
-    EXPECT_THAT(makeIndexPage({document}),
-                HasSubstr("<a href=\"#p2\" style=\"left:10%;top:10%;width:50%;height:5%\"></a>"));
+    EXPECT_THAT(
+        makeIndexPage({document}),
+        HasSubstr(
+            "<a href=\"#p2\" style=\"left:10%;top:10%;width:50%;height:5%\" aria-label=\"Page 2\"></a>"));
 }
 
 TEST(IndexPage, LinksLeadToPagesAndPlacesOfTheIndex) {
@@ -60,20 +68,48 @@ TEST(IndexPage, OtherPlacesOpenBesideItAndProgramsAreLeftOut) {
 TEST(IndexPage, TheOutlineIsNestedAndLeadsToPagesThatAreThere) {
     IndexDocument document = makeDocument("a");
     document.outline = {{"One <&", 0, 0}, {"Below", 2, 1}, {"Missing", 1, 1}, {"Two", 2, 0}};
-    EXPECT_THAT(makeIndexPage({document}),
-                HasSubstr("<nav>\n<ul>\n<li><a href=\"#p1\">One &lt;&amp;</a>\n<ul>\n"
-                          "<li><a href=\"#p2\">Below</a>\n<li><span>Missing</span>\n</ul>\n"
-                          "<li><a href=\"#p2\">Two</a>\n</ul>\n</nav>"));
+    EXPECT_THAT(
+        makeIndexPage({document}),
+        HasSubstr(
+            "<nav aria-label=\"Outline\">\n<ul>\n<li><a href=\"#p1\">One &lt;&amp;</a>\n<ul>\n"
+            "<li><a href=\"#p2\">Below</a>\n<li><span>Missing</span>\n</ul>\n"
+            "<li><a href=\"#p2\">Two</a>\n</ul>\n</nav>"));
 }
 
 TEST(IndexPage, WithoutAnOutlineThereIsNoPlaceForOne) {
-    EXPECT_THAT(makeIndexPage({makeDocument("a")}), Not(HasSubstr("<nav>")));
+    EXPECT_THAT(makeIndexPage({makeDocument("a")}), Not(HasSubstr("<nav")));
 }
 
 TEST(IndexPage, SeveralDocumentsAreChaptersOfIt) {
-    EXPECT_THAT(makeIndexPage({makeDocument("a"), makeDocument("b")}),
-                HasSubstr("<nav>\n<ul>\n<li><a href=\"#p1\">Title of a</a>\n</ul>\n"
-                          "<ul>\n<li><a href=\"#p3\">Title of b</a>\n</ul>\n</nav>"));
+    EXPECT_THAT(
+        makeIndexPage({makeDocument("a"), makeDocument("b")}),
+        HasSubstr("<nav aria-label=\"Outline\">\n<ul>\n<li><a href=\"#p1\">Title of a</a>\n</ul>\n"
+                  "<ul>\n<li><a href=\"#p3\">Title of b</a>\n</ul>\n</nav>"));
+}
+
+TEST(IndexPage, EverythingHasAName) {
+    IndexDocument document = makeDocument("a");
+    document.entries[0].links = {{0, 0, 1, 1, "https://www.example.com/?a&b"}};
+    document.outline = {{"One", 0, 0}};
+    const std::string page = makeIndexPage({document});
+    EXPECT_THAT(page, HasSubstr("<html lang=\"en\">"));
+    EXPECT_THAT(page, HasSubstr("aria-label=\"https://www.example.com/?a&amp;b\"></a>"));
+    EXPECT_THAT(page, HasSubstr("<main tabindex=\"0\" aria-label=\"Pages\">"));
+    const std::regex nameless(
+        "<(button|input|nav)(?![^>]*aria-label)|<a(?![^>]*aria-label)[^>]*></a>");
+    EXPECT_FALSE(std::regex_search(page, nameless));
+}
+
+TEST(IndexPage, WithoutScriptsItIsAListOfPages) {
+    EXPECT_THAT(makeIndexPage({makeDocument("a")}),
+                HasSubstr("<noscript><ol>\n<li><a href=\"a1.svg\">Title of a, page 1</a>\n"
+                          "<li><a href=\"a3.svg\">Title of a, page 3</a>\n</ol></noscript>"));
+}
+
+TEST(IndexPage, ItsPaperHoldsTheLargestPage) {
+    IndexDocument document = makeDocument("a");
+    document.entries[1].size = {50, 300};
+    EXPECT_THAT(makeIndexPage({document}), HasSubstr("@page { margin: 0; size: 200pt 300pt; }"));
 }
 
 TEST(IndexPage, NothingComesFromElsewhere) {

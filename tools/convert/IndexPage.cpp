@@ -60,50 +60,67 @@ public:
         if (hasOutline) {
             writeOutline();
         }
-        html += "<main tabindex=\"0\">\n";
+        html += "<main tabindex=\"0\" aria-label=\"Pages\">\n";
         for (const IndexDocument& document : documents) {
             for (const IndexEntry& entry : document.entries) {
                 writePage(entry);
             }
         }
+        writeFallback();
         html += std::string("</main>\n<script>") + indexScript + "</script>\n</body>\n</html>\n";
         return html;
     }
 
 private:
     void writeHead() {
-        html = "<!DOCTYPE html>\n<html>\n<head>\n<meta charset=\"utf-8\">\n";
+        html = "<!DOCTYPE html>\n<html lang=\"en\">\n<head>\n<meta charset=\"utf-8\">\n";
         html += std::string(indexMark) + "\n";
         html += "<meta name=\"viewport\" content=\"width=device-width\">\n";
         html += "<title>" + escape(documents.front().title) + "</title>\n";
-        html += std::string("<style>") + indexStyle + "</style>\n</head>\n";
+        html += std::string("<style>") + indexStyle + makePaper() + "</style>\n</head>\n";
         html += hasOutline ? "<body class=\"outline\">\n" : "<body>\n";
     }
 
-    void writeButton(const char* id, const char* title, const char* label) {
-        html += std::string("<button id=\"") + id + "\" title=\"" + title + "\">" + label +
-                "</button>\n";
+    /// Returns: the style that prints each page on a sheet, of the size of the largest.
+    std::string makePaper() const {
+        PageSize paper;
+        for (const IndexDocument& document : documents) {
+            for (const IndexEntry& entry : document.entries) {
+                paper.width = std::max(paper.width, entry.size.width);
+                paper.height = std::max(paper.height, entry.size.height);
+            }
+        }
+        return "@page { margin: 0; size: " + toText(paper.width) + "pt " + toText(paper.height) +
+               "pt; }\n";
+    }
+
+    void writeButton(const char* id, const char* name, const char* key, const char* label,
+                     const char* more = "") {
+        html += std::string("<button id=\"") + id + "\" title=\"" + name + " (" + key +
+                ")\" aria-label=\"" + name + "\"" + more + ">" + label + "</button>\n";
     }
 
     void writeHeader() {
         html += "<header>\n";
         if (hasOutline) {
-            writeButton("outline", "Outline (o)", "&#9776;");
+            writeButton("outline", "Outline", "o", "&#9776;", " aria-expanded=\"true\"");
         }
-        writeButton("previous", "Previous page (left)", "&#9664;");
-        html += "<input id=\"number\" type=\"number\" min=\"1\" value=\"1\" title=\"Page\" max=\"" +
-                std::to_string(pageCount) + "\"> / " + std::to_string(pageCount) + "\n";
-        writeButton("next", "Next page (right)", "&#9654;");
+        writeButton("previous", "Previous page", "left", "&#9664;");
+        html +=
+            "<input id=\"number\" type=\"number\" min=\"1\" value=\"1\" aria-label=\"Page\" max=\"" +
+            std::to_string(pageCount) + "\"> / " + std::to_string(pageCount) + "\n";
+        writeButton("next", "Next page", "right", "&#9654;");
         html += "<span class=\"space\"></span>\n";
-        writeButton("smaller", "Smaller (-)", "&minus;");
-        writeButton("zoom", "Full size (0)", "100 %");
-        writeButton("larger", "Larger (+)", "+");
-        writeButton("fit", "Fit to the width (w)", "&harr;");
+        writeButton("smaller", "Smaller", "-", "&minus;");
+        writeButton("zoom", "Full size", "0", "100 %");
+        writeButton("larger", "Larger", "+", "+");
+        writeButton("fit", "Fit to the width", "w", "&harr;");
+        writeButton("print", "Print all pages", "Ctrl+P", "Print");
         html += "</header>\n";
     }
 
     void writeOutline() {
-        html += "<nav>\n";
+        html += "<nav aria-label=\"Outline\">\n";
         for (const IndexDocument& document : documents) {
             depth = 0;
             if (documents.size() > 1) {
@@ -147,9 +164,9 @@ private:
 
     void writePage(const IndexEntry& entry) {
         const std::string number = std::to_string(numbers.at(entry.file));
-        html += "<section id=\"p" + number + "\" style=\"--w:" + toText(entry.size.width) +
-                ";--h:" + toText(entry.size.height) + "\" data-file=\"" + escape(entry.file) +
-                "\">\n";
+        html += "<section id=\"p" + number + "\" role=\"group\" aria-label=\"Page " + number +
+                "\" style=\"--w:" + toText(entry.size.width) + ";--h:" + toText(entry.size.height) +
+                "\" data-file=\"" + escape(entry.file) + "\">\n";
         for (const IndexAnchor& anchor : entry.anchors) {
             html += "<i id=\"p" + number + "." + escape(anchor.id) +
                     "\" style=\"top:" + toPercent(anchor.y, entry.size.height) + "\"></i>\n";
@@ -158,6 +175,18 @@ private:
             writeLink(entry, link);
         }
         html += "</section>\n";
+    }
+
+    /// For readers without scripts.
+    void writeFallback() {
+        html += "<noscript><ol>\n";
+        for (const IndexDocument& document : documents) {
+            for (const IndexEntry& entry : document.entries) {
+                html += "<li><a href=\"" + escape(entry.file) + "\">" + escape(document.title) +
+                        ", page " + std::to_string(entry.page + 1) + "</a>\n";
+            }
+        }
+        html += "</ol></noscript>\n";
     }
 
     void writeLink(const IndexEntry& entry, const LinkArea& link) {
@@ -170,7 +199,13 @@ private:
                 " style=\"left:" + toPercent(link.x, entry.size.width) +
                 ";top:" + toPercent(link.y, entry.size.height) +
                 ";width:" + toPercent(link.width, entry.size.width) +
-                ";height:" + toPercent(link.height, entry.size.height) + "\"></a>\n";
+                ";height:" + toPercent(link.height, entry.size.height) + "\" aria-label=\"" +
+                escape(describeTarget(target)) + "\"></a>\n";
+    }
+
+    /// Returns: what a link is called that has no text of its own.
+    static std::string describeTarget(const std::string& target) {
+        return target.starts_with("#p") ? "Page " + target.substr(2, target.find('.') - 2) : target;
     }
 
     /// Returns: where a link of a page leads in the index, or outside of it; nothing when a reader
