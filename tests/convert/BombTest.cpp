@@ -17,6 +17,7 @@ using DrawmereConvert::TEXTMODE;
 using DrawmereConvert::TEXTMODE_FONTS;
 using DrawmereConvert::TEXTMODE_OUTLINES;
 using DrawmereConvert::TEXTMODE_PLAIN;
+using testing::ContainsRegex;
 using testing::ElementsAre;
 using testing::HasSubstr;
 
@@ -77,6 +78,25 @@ TEST_F(Bomb, APageThatUnpacksForEverLeavesTheRestOfOneDocument) {
     EXPECT_EQ(output.status, incomplete);
     EXPECT_THAT(output.output, HasSubstr("width=\"50\" height=\"50\""));
     EXPECT_THAT(output.output, HasSubstr("content.pdf: page 1: given up"));
+}
+
+TEST_F(Bomb, APageOfEndlesslyManyShapesLeavesTheRest) {
+    const CommandResult result =
+        conversion->runShell("ulimit -v 300000; $convert shapes.pdf --max-memory 100 -o out/");
+    EXPECT_EQ(result.status, incomplete);
+    EXPECT_THAT(result.output,
+                HasSubstr("shapes.pdf: page 1: it takes more memory than it may have"));
+    EXPECT_THAT(conversion->list("out"), ElementsAre("shapes2.svg"));
+}
+
+TEST_F(Bomb, TheMemoryOfAPageIsBounded) {
+    const std::string command = "$convert content.pdf -q --timeout .4 -o out/ --jobs 1 ";
+    const std::string look = " & p=$!; sleep .2; read c rest </proc/$p/task/$p/children; "
+                             "grep 'Max address space' /proc/$c/limits; wait $p";
+    EXPECT_THAT(conversion->runShell(command + "--max-memory 100" + look).output,
+                ContainsRegex("Max address space +746586112 ")); // 2 * 100 + 512 of 2^20
+    EXPECT_THAT(conversion->runShell(command + "--max-memory 0" + look).output,
+                ContainsRegex("Max address space +unlimited "));
 }
 
 TEST_F(Bomb, ATreeOfPagesThatIsTooDeepIsSaid) {

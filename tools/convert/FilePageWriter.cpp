@@ -28,9 +28,9 @@ PageOutcome FilePageWriter::write(int page) {
         noteLateness(outcome, watchdog.hasBarked());
     } catch (const ConvertError& error) {
         outcome.isUnreadable = true;
-        noteFault(outcome, error.what());
+        noteFault(outcome, error);
     } catch (const std::exception& error) {
-        noteFault(outcome, error.what());
+        noteFault(outcome, error);
         clearRoom();
     }
     takeErrors(config, outcome);

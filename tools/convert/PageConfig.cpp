@@ -1,5 +1,7 @@
 #include "tools/convert/PageConfig.h"
 
+#include <new>
+
 namespace DrawmereConvert {
 
 using MoxCommonNS::MoxName;
@@ -43,6 +45,12 @@ void noteFault(PageOutcome& outcome, const std::string& reason) {
     if (outcome.error.empty()) {
         outcome.error = reason;
     }
+}
+
+void noteFault(PageOutcome& outcome, const std::exception& error) {
+    const bool isForMemory = dynamic_cast<const std::bad_alloc*>(&error) != nullptr;
+    noteFault(outcome, isForMemory ? std::string("it takes more memory than it may have")
+                                   : std::string(error.what()));
 }
 
 void noteLateness(PageOutcome& outcome, bool isLate) {

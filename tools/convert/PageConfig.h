@@ -4,6 +4,8 @@
 #include "tools/convert/PageOutcome.h"
 #include "tools/convert/RunOptions.h"
 
+#include <exception>
+
 namespace DrawmereConvert {
 
 using DrawmereNS::SVGConfig;
@@ -17,6 +19,7 @@ void takeErrors(SVGConfig& config, PageOutcome& outcome);
 
 /// Says in the outcome that something of the page is missing, and why. The first reason stays.
 void noteFault(PageOutcome& outcome, const std::string& reason);
+void noteFault(PageOutcome& outcome, const std::exception& error);
 
 /// Says in the outcome whether the page was given up when its time was over.
 void noteLateness(PageOutcome& outcome, bool isLate);

@@ -3,9 +3,31 @@
 #include "tools/convert/FilePageWriter.h"
 #include "tools/convert/WholeDocumentWriter.h"
 
+#include <algorithm>
+
+#include <sys/resource.h>
+
 namespace DrawmereConvert {
+namespace {
+
+/// Bounds what the process can ask for: as much again as the reader of the document may have, and
+/// some room for the program itself. What asks for more gets an exception.
+void limitMemory(std::size_t readerBytes) {
+#if !defined(__SANITIZE_ADDRESS__) // which sets aside more than any machine has
+    constexpr rlim_t room = rlim_t{512} << 20U;
+    rlimit limit = {};
+    if (readerBytes == 0 || getrlimit(RLIMIT_AS, &limit) != 0) {
+        return;
+    }
+    limit.rlim_cur = std::min(limit.rlim_max, 2 * rlim_t{readerBytes} + room);
+    setrlimit(RLIMIT_AS, &limit);
+#endif
+}
+
+} // namespace
 
 std::unique_ptr<PageWriter> makePageWriter(const PageJob& job, int room) {
+    limitMemory(job.options.convert.maxMemory);
     if (!job.files) {
         return std::make_unique<WholeDocumentWriter>(job, std::string());
     }

@@ -40,9 +40,9 @@ PageOutcome WholeDocumentWriter::write(int page) {
         noteLateness(outcome, watchdog.hasBarked());
     } catch (const ConvertError& error) {
         outcome.isUnreadable = true;
-        noteFault(outcome, error.what());
+        noteFault(outcome, error);
     } catch (const std::exception& error) {
-        noteFault(outcome, error.what());
+        noteFault(outcome, error);
     }
     takeErrors(config, outcome);
     return outcome;
@@ -78,7 +78,7 @@ PageOutcome WholeDocumentWriter::finish() {
         save();
         outcome.isWritten = true;
     } catch (const std::exception& error) {
-        noteFault(outcome, error.what());
+        noteFault(outcome, error);
     }
     takeErrors(config, outcome);
     return outcome;
