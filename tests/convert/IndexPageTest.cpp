@@ -76,6 +76,14 @@ TEST(IndexPage, TheOutlineIsNestedAndLeadsToPagesThatAreThere) {
             "<li><a href=\"#p2\">Two</a>\n</ul>\n</nav>"));
 }
 
+TEST(IndexPage, AnOutlineIsInTheLanguageOfItsDocument) {
+    IndexDocument document = makeDocument("a");
+    document.language = "de";
+    document.outline = {{"Eins", 0, 0}, {"Zwei", 0, 1}};
+    EXPECT_THAT(makeIndexPage({document}), HasSubstr("<ul lang=\"de\">\n<li><a href=\"#p1\">Eins"
+                                                     "</a>\n<ul>\n<li>"));
+}
+
 TEST(IndexPage, WithoutAnOutlineThereIsNoPlaceForOne) {
     EXPECT_THAT(makeIndexPage({makeDocument("a")}), Not(HasSubstr("<nav")));
 }

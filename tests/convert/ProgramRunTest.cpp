@@ -175,6 +175,20 @@ TEST_F(ProgramRun, NamesMayHoldAnything) {
     EXPECT_TRUE(conversion.directory.has("a:b.svg"));
 }
 
+TEST_F(ProgramRun, TheIndexKnowsTitleAndLanguage) {
+    conversion.directory.write(
+        "t.pdf", "%PDF-1.4\n1 0 obj\n<</Type/Catalog/Pages 2 0 R/Lang(de-DE)/Outlines 4 0 R>>\n"
+                 "endobj\n2 0 obj\n<</Type/Pages/Count 2/Kids[3 0 R 3 0 R]>>\nendobj\n"
+                 "3 0 obj\n<</Type/Page/Parent 2 0 R/MediaBox[0 0 9 9]>>\nendobj\n"
+                 "4 0 obj\n<</First 5 0 R>>\nendobj\n5 0 obj\n<</Title(Eins)>>\nendobj\n"
+                 "6 0 obj\n<</Title(Bericht)>>\nendobj\n"
+                 "trailer\n<</Root 1 0 R/Info 6 0 R>>\n");
+    EXPECT_EQ(conversion.run({"t.pdf", "-o", "out/"}).status, 0);
+    const std::string index = conversion.directory.read("out/index.html");
+    EXPECT_THAT(index, HasSubstr("<title>Bericht</title>"));
+    EXPECT_THAT(index, HasSubstr("<ul lang=\"de\">\n<li><span>Eins</span>"));
+}
+
 TEST_F(ProgramRun, SeveralDocumentsShareAnIndex) {
     conversion.directory.write("b.pdf", makePlainPdf(1));
     EXPECT_EQ(run({"b.pdf", "--pages", "1", "-o", "out/"}),

@@ -8,6 +8,8 @@
 #include "tools/convert/PagePainter.h"
 #include "tools/convert/TextFont.h"
 
+#include <mupdf/pdf.h>
+
 #include <algorithm>
 #include <utility>
 
@@ -69,6 +71,18 @@ std::string DocumentConverter::getTitle() const {
     const bool isKnown = callFitz(
         ctx, [&] { fz_lookup_metadata(ctx, document, FZ_META_INFO_TITLE, title, sizeof title); });
     return isKnown ? title : "";
+}
+
+std::string DocumentConverter::getLanguage() const {
+    char language[8] = "";
+    fz_context* ctx = file->ctx;
+    fz_document* document = file->document;
+    const bool isKnown = callFitz(ctx, [&] {
+        if (pdf_document* const pdf = pdf_specifics(ctx, document)) {
+            fz_string_from_text_language(language, pdf_document_language(ctx, pdf));
+        }
+    });
+    return isKnown ? language : "";
 }
 
 std::vector<OutlineEntry> DocumentConverter::getOutline() const {

@@ -59,6 +59,9 @@ public:
     /// Returns: the title from the document's own data, UTF-8, or nothing.
     std::string getTitle() const;
 
+    /// Returns: the language that the document says it is in, such as "de", or nothing.
+    std::string getLanguage() const;
+
     /// Returns: the outline; empty when there is none or it can't be read.
     std::vector<OutlineEntry> getOutline() const;
 

@@ -273,6 +273,7 @@ IndexDocument DocumentRun::describe() const {
     if (document.title.empty()) {
         document.title = fs::path(input).stem().string();
     }
+    document.language = converter.getLanguage();
     document.outline = outline;
     for (const auto& [page, outcome] : outcomes) {
         if (outcome.isWritten) {

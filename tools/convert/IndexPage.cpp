@@ -123,6 +123,7 @@ private:
         html += "<nav aria-label=\"Outline\">\n";
         for (const IndexDocument& document : documents) {
             depth = 0;
+            language = document.language;
             if (documents.size() > 1) {
                 const bool isEmpty = document.entries.empty();
                 writeOutlineEntry(document.title, 0,
@@ -155,7 +156,8 @@ private:
     /// Opens or closes lists. The end of an item need not be written in HTML.
     void setDepth(int wanted) {
         for (; depth < wanted; ++depth) {
-            html += "<ul>\n";
+            const bool isInLanguage = depth == 0 && !language.empty();
+            html += isInLanguage ? "<ul lang=\"" + escape(language) + "\">\n" : "<ul>\n";
         }
         for (; depth > wanted; --depth) {
             html += "</ul>\n";
@@ -225,7 +227,8 @@ private:
     std::map<std::string, int> numbers; // of pages in the index, from 1, by their files
     int pageCount = 0;
     bool hasOutline = false;
-    int depth = 0; // of open lists
+    int depth = 0;        // of open lists
+    std::string language; // of the outline in hand
     std::string html;
 };
 

@@ -25,7 +25,8 @@ struct IndexEntry {
 
 /// A document as the index shows it.
 struct IndexDocument {
-    std::string title; ///< UTF-8
+    std::string title;    ///< UTF-8
+    std::string language; ///< of the outline, as in "de"; empty when it is not known
     std::vector<OutlineEntry> outline;
     std::vector<IndexEntry> entries;
 };

@@ -93,10 +93,13 @@ PageLink toLink(fz_context* ctx, fz_document* document, const fz_link& link) {
 int findPage(fz_context* ctx, fz_document* document, const fz_outline& entry) {
     int page = -1;
     const char* uri = entry.uri;
+    if (!uri) {
+        return page; // MuPDF takes it for the first
+    }
     const fz_location known = entry.page;
     callFitz(ctx, [&] {
         const bool isKnown = known.page >= 0;
-        if (isKnown || (uri && !fz_is_external_link(ctx, uri))) {
+        if (isKnown || !fz_is_external_link(ctx, uri)) {
             const fz_location place =
                 isKnown ? known : fz_resolve_link_dest(ctx, document, uri).loc;
             page = fz_page_number_from_location(ctx, document, place);
