@@ -90,8 +90,8 @@ TEST_F(Bomb, APageOfEndlesslyManyShapesLeavesTheRest) {
 }
 
 TEST_F(Bomb, TheMemoryOfAPageIsBounded) {
-    const std::string command = "$convert content.pdf -q --timeout .4 -o out/ --jobs 1 ";
-    const std::string look = " & p=$!; sleep .2; read c rest </proc/$p/task/$p/children; "
+    const std::string command = "$convert content.pdf -q --timeout 1 -o out/ --jobs 1 ";
+    const std::string look = " & p=$!; sleep .5; read c rest </proc/$p/task/$p/children; "
                              "grep 'Max address space' /proc/$c/limits; wait $p";
     EXPECT_THAT(conversion->runShell(command + "--max-memory 100" + look).output,
                 ContainsRegex("Max address space +746586112 ")); // 2 * 100 + 512 of 2^20
@@ -131,6 +131,19 @@ TEST_F(Bomb, ADocumentThatTakesTooLongLeavesTheOthers) {
     EXPECT_EQ(result.output, "nested.html: it takes too long to read the document\n"
                              "plain.pdf: 2 pages written to out/\n");
     EXPECT_THAT(conversion->list("out"), ElementsAre("index.html", "plain1.svg", "plain2.svg"));
+}
+
+TEST_F(Bomb, AReaderThatBreaksOffAtOnceIsSaid) {
+    const CommandResult one = conversion->runShell(
+        "$convert nested.html -o out/ & p=$!; sleep .5; kill -SEGV $p; wait $p");
+    EXPECT_EQ(one.status, unreadable);
+    EXPECT_EQ(one.output, "nested.html: the reader of the document broke off\n");
+    const CommandResult several =
+        conversion->runShell("$convert nested.html plain.pdf -o out/ & p=$!; sleep .5; "
+                             "kill -KILL $(cat /proc/$p/task/$p/children); wait $p");
+    EXPECT_EQ(several.status, incomplete);
+    EXPECT_EQ(several.output, "nested.html: the reader of the document broke off (Killed)\n"
+                              "plain.pdf: 2 pages written to out/\n");
 }
 
 TEST_F(Bomb, AnImageThatViewersRefuseGoesToAFile) {

@@ -36,5 +36,12 @@ TEST(PageOutcome, ItIsTheSameWhenItArrives) {
     EXPECT_EQ(arrived.report.links[0].target, "page2.svg#there");
 }
 
+TEST(OutlineEntry, KeepsItselfOnTheWay) {
+    using DrawmereConvert::OutlineEntry;
+    const std::vector<OutlineEntry> outline = {{" One\n two ", 12, 0}, {"", -1, 3}, {"7", 0, 1}};
+    EXPECT_EQ(DrawmereConvert::unpackOutline(DrawmereConvert::packOutline(outline)), outline);
+    EXPECT_TRUE(DrawmereConvert::unpackOutline("").empty());
+}
+
 } // namespace
 } // namespace DrawmereTest

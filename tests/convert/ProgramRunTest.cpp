@@ -222,8 +222,8 @@ TEST(Jobs, EachIsAProcess) {
     conversion.directory.write("a.pdf", TinyPdf().addEndlessPage().addEndlessPage().write());
     for (const std::string jobs : {"1", "2"}) {
         const CommandResult result = conversion.runShell(
-            "$convert a.pdf -q -o out/ --timeout .5 --jobs " + jobs +
-            " 2>&1 & p=$!; sleep .2; wc -w </proc/$p/task/$p/children; wait $p");
+            "$convert a.pdf -q -o out/ --timeout 1 --jobs " + jobs +
+            " 2>&1 & p=$!; sleep .5; wc -w </proc/$p/task/$p/children; wait $p");
         EXPECT_THAT(result.output, StartsWith(jobs + "\n"));
     }
 }
