@@ -64,6 +64,10 @@ set_target_properties(drawmere PROPERTIES
     VERSION ${PROJECT_VERSION}
     SOVERSION ${PROJECT_VERSION_MAJOR}
 )
+# Calls inside the library stay inside: nobody puts functions of theirs in the place of ours.
+target_compile_options(mox PRIVATE $<$<NOT:$<CONFIG:Debug>>:-fno-semantic-interposition>)
+target_compile_options(drawmere_objects PRIVATE $<$<NOT:$<CONFIG:Debug>>:-fno-semantic-interposition>)
+target_link_options(drawmere PRIVATE -Wl,-Bsymbolic-functions)
 target_link_libraries(mox PUBLIC drawmere_flags drawmere_depends)
 target_link_libraries(drawmere_objects PUBLIC drawmere_flags drawmere_depends)
 target_link_libraries(drawmere PUBLIC ICU::uc PRIVATE drawmere_flags drawmere_depends)
