@@ -100,6 +100,14 @@ void MoxElement::removeAttribute(MoxName name) {
 
 bool MoxElement::hasAttribute(MoxName name) const { return find(name) != nullptr; }
 
+void MoxElement::reserveAttributes(int count) {
+    if (!attributes && count > 0) {
+        const std::uint32_t capacity = std::min(static_cast<std::uint32_t>(count), maxCapacity);
+        attributes = static_cast<MoxValue*>(MoxNodeHeap::allocate(sizeOf(capacity)));
+        attributeCapacity = static_cast<std::uint16_t>(capacity);
+    }
+}
+
 void MoxElement::setName(MoxName newUri, MoxName newPrefix, MoxName newLocal) {
     uri = newUri;
     prefix = newPrefix;

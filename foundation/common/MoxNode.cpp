@@ -38,7 +38,9 @@ bool MoxNode::hasChildNodes() const { return firstChild != nullptr; }
 
 MoxNode* MoxNode::getFirstChild() const { return firstChild; }
 
-MoxNode* MoxNode::getPreviousSibling() const { return previousSibling; }
+MoxNode* MoxNode::getPreviousSibling() const {
+    return previous && previous->nextSibling ? previous : nullptr;
+}
 
 MoxNode* MoxNode::getNextSibling() const { return nextSibling; }
 
@@ -154,21 +156,33 @@ bool MoxNode::hasRoomInDocument(const MoxNode* child) const {
 }
 
 void MoxNode::link(MoxNode* child, MoxNode* ref) {
-    MoxNode* before = ref ? ref->previousSibling : lastChild;
+    MoxNode* last = lastLink();
     child->parent = this;
-    child->previousSibling = before;
     child->nextSibling = ref;
-    (before ? before->nextSibling : firstChild) = child;
-    (ref ? ref->previousSibling : lastChild) = child;
+    if (ref && ref != firstChild) {
+        ref->previous->nextSibling = child;
+    } else if (!ref && last) {
+        last->nextSibling = child;
+    } else {
+        firstChild = child;
+    }
+    MoxNode* behind = ref ? ref : firstChild;
+    child->previous = last ? behind->previous : child;
+    behind->previous = child;
 }
 
 void MoxNode::unlink(MoxNode* child) {
-    MoxNode* before = child->previousSibling;
     MoxNode* behind = child->nextSibling;
-    (before ? before->nextSibling : firstChild) = behind;
-    (behind ? behind->previousSibling : lastChild) = before;
+    if (child == firstChild) {
+        firstChild = behind;
+    } else {
+        child->previous->nextSibling = behind;
+    }
+    if (firstChild) {
+        (behind ? behind : firstChild)->previous = child->previous;
+    }
     child->parent = nullptr;
-    child->previousSibling = nullptr;
+    child->previous = nullptr;
     child->nextSibling = nullptr;
 }
 
@@ -191,21 +205,19 @@ void MoxNode::releaseChildren() {
     // A dying child hands its children to this list, so the depth of the tree costs no stack.
     MoxNode* pending = firstChild;
     firstChild = nullptr;
-    lastChild = nullptr;
     while (pending) {
         MoxNode* child = pending;
         pending = child->nextSibling;
         child->parent = nullptr;
-        child->previousSibling = nullptr;
+        child->previous = nullptr;
         child->nextSibling = nullptr;
         if (!child->releaseWithoutDelete()) {
             continue;
         }
         if (child->firstChild) {
-            child->lastChild->nextSibling = pending;
+            child->lastLink()->nextSibling = pending;
             pending = child->firstChild;
             child->firstChild = nullptr;
-            child->lastChild = nullptr;
         }
         delete child;
     }

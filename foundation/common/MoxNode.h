@@ -142,13 +142,14 @@ private:
     void setOwnerOfSubtree(const MoxPtr<DocumentLink>& link);
     void releaseChildren();
 
+    MoxNode* lastLink() const { return firstChild ? firstChild->previous : nullptr; }
+
     MoxNodeType kind;
-    MoxNode* parent = nullptr;          // borrowed
-    MoxNode* previousSibling = nullptr; // borrowed
-    MoxNode* nextSibling = nullptr;     // owned, by the parent's reference
-    MoxPtr<DocumentLink> owner;         // shared by all nodes of a document
-    MoxNode* firstChild = nullptr;      // owned, by reference
-    MoxNode* lastChild = nullptr;       // borrowed
+    MoxNode* parent = nullptr;      // borrowed
+    MoxNode* previous = nullptr;    // borrowed; before the first child comes the last
+    MoxNode* nextSibling = nullptr; // owned, by the parent's reference
+    MoxPtr<DocumentLink> owner;     // shared by all nodes of a document
+    MoxNode* firstChild = nullptr;  // owned, by reference
 };
 
 /// Narrows a node to a class by the type test. Returns: null for null and for a no.

@@ -29,7 +29,7 @@ constexpr std::size_t largestBlock = 2048;
 constexpr std::size_t chunkAlignment = 32768;
 /// A little less, which leaves the general allocator its header and lets it pack chunks.
 constexpr std::size_t chunkSize = chunkAlignment - 16;
-constexpr std::size_t blockAlignment = 16;
+constexpr std::size_t blockAlignment = 8;
 
 /// Large documents take their chunks from slabs, which the system can back with one huge page each.
 constexpr std::size_t slabSize = std::size_t{1} << 21;
@@ -65,17 +65,18 @@ void drop(Slab* slab) {
     }
 }
 
-/// Returns: whether the chunk went with its last user.
-bool drop(Chunk* chunk) {
-    if (MoxMutex::interlockedDecrement(chunk->users) != 0) {
-        return false;
+/// Returns: how many users are left; the chunk goes with the last.
+int drop(Chunk* chunk) {
+    const int left = MoxMutex::interlockedDecrement(chunk->users);
+    if (left != 0) {
+        return left;
     }
     if (chunk->slab) {
         drop(chunk->slab);
     } else {
         std::free(chunk);
     }
-    return true;
+    return 0;
 }
 
 void* allocateAligned(std::size_t alignment, std::size_t size) {
@@ -113,6 +114,7 @@ struct Cutter {
     }
 
     void renew();
+    void rewind();
 
 private:
     void closeChunk();
@@ -121,7 +123,8 @@ private:
     void openChunkOfSlab();
 };
 
-constinit thread_local Cutter cutter;
+// Every node asks for it: found without a call, as what is here from the start of a program is.
+[[gnu::tls_model("initial-exec")]] constinit thread_local Cutter cutter;
 
 /// Gives the thread's chunk back when the thread ends.
 struct ThreadEnd {
@@ -133,7 +136,7 @@ struct ThreadEnd {
 thread_local ThreadEnd threadEnd;
 
 void Cutter::closeChunk() {
-    if (chunk && drop(chunk)) {
+    if (chunk && drop(chunk) == 0) {
         chunksInRow = 0; // what it was cut for is gone
     }
     chunk = nullptr;
@@ -184,6 +187,17 @@ void Cutter::renew() {
               nullptr);
 }
 
+/// Cuts from the beginning again where nothing stands any longer, so that one document after
+/// another takes the memory of one. A slab goes back: what it was cut for was large.
+void Cutter::rewind() {
+    if (slab) {
+        close();
+        return;
+    }
+    cursor = reinterpret_cast<char*>(chunk) + sizeof(Chunk);
+    chunksInRow = 0;
+}
+
 void* allocateLarge(std::size_t size) {
     void* block = std::malloc(size);
     if (!block) {
@@ -217,7 +231,10 @@ void MoxNodeHeap::release(void* block, std::size_t size) {
     if (cutter.isNewest(block, rounded)) {
         cutter.cursor -= rounded;
     }
-    drop(findChunk(block));
+    Chunk* chunk = findChunk(block);
+    if (drop(chunk) == 1 && chunk == cutter.chunk) {
+        cutter.rewind(); // the thread itself is its only user
+    }
 }
 
 bool MoxNodeHeap::growInPlace(void* block, std::size_t size, std::size_t newSize) {

@@ -14,7 +14,7 @@ namespace MoxCommonNS {
 /// sanitizer takes every block from the general allocator, so that the sanitizer sees it.
 class DRAWMERE_API MoxNodeHeap {
 public:
-    /// Returns: a block of `size` bytes, aligned to 16. Throws: std::bad_alloc.
+    /// Returns: a block of `size` bytes, aligned to 8. Throws: std::bad_alloc.
     static void* allocate(std::size_t size);
 
     /// Gives a block back. `size`: as allocated or grown to. Ignores: a null.

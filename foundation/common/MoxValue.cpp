@@ -1,6 +1,7 @@
 #include "foundation/common/MoxValue.h"
 
 #include "foundation/common/MoxAsciiChars.h"
+#include "foundation/common/MoxMutex.h"
 #include "foundation/common/MoxNameTable.h"
 #include "foundation/common/MoxNamedValueMap.h"
 #include "foundation/common/MoxNumberText.h"
@@ -16,11 +17,17 @@
 #include <string>
 #include <type_traits>
 
+#if defined(__SSE2__)
+#include <emmintrin.h>
+#endif
+
 namespace MoxCommonNS {
 
-/// A text on the heap: its length in code units, then the units.
+/// A text on the heap: its length in code units, then the units. Values that are copies of each
+/// other share it, as nobody changes it.
 struct MoxValue::HeapText {
     std::uint32_t length;
+    int users = 1;
 
     template <typename Unit> Unit* units() { return reinterpret_cast<Unit*>(this + 1); }
 
@@ -53,6 +60,46 @@ template <typename Unit> bool isAscii(std::basic_string_view<Unit> text) {
         seen = static_cast<std::make_unsigned_t<Unit>>(seen | unit);
     }
     return seen < 0x80;
+}
+
+bool isAscii(std::u16string_view text) {
+#if defined(__SSE2__)
+    constexpr std::size_t blockSize = 8;
+    if (text.size() >= blockSize) {
+        const auto load = [&text](std::size_t i) {
+            return _mm_loadu_si128(reinterpret_cast<const __m128i*>(text.data() + i));
+        };
+        __m128i seen = load(text.size() - blockSize); // the blocks may overlap
+        for (std::size_t i = 0; i + blockSize < text.size(); i += blockSize) {
+            seen = _mm_or_si128(seen, load(i));
+        }
+        const __m128i beyond = _mm_andnot_si128(_mm_set1_epi16(0x7F), seen);
+        return _mm_movemask_epi8(_mm_cmpeq_epi8(beyond, _mm_setzero_si128())) == 0xFFFF;
+    }
+#endif
+    return isAscii<char16_t>(text);
+}
+
+/// Writes ASCII units as bytes. Shape: `target[text.size()]`.
+void narrowAscii(std::u16string_view text, char* target) {
+#if defined(__SSE2__)
+    constexpr std::size_t blockSize = 8;
+    if (text.size() >= blockSize) {
+        const auto narrow = [&text, target](std::size_t i) {
+            const __m128i block =
+                _mm_loadu_si128(reinterpret_cast<const __m128i*>(text.data() + i));
+            _mm_storel_epi64(reinterpret_cast<__m128i*>(target + i),
+                             _mm_packus_epi16(block, block));
+        };
+        for (std::size_t i = 0; i + blockSize < text.size(); i += blockSize) {
+            narrow(i);
+        }
+        narrow(text.size() - blockSize);
+        return;
+    }
+#endif
+    std::transform(text.begin(), text.end(), target,
+                   [](char16_t c) { return static_cast<char>(c); });
 }
 
 UnicodeString fromBytes(const char* text, std::size_t length) {
@@ -129,8 +176,7 @@ void MoxValue::storeText(std::u16string_view text) {
         store(MOXVALUE_STRING, heap);
         form = asciiForm;
     }
-    std::transform(text.begin(), text.end(), target,
-                   [](char16_t c) { return static_cast<char>(c); });
+    narrowAscii(text, target);
 }
 
 MoxValue::MoxValue(const MoxNamedValueMap& map) {
@@ -187,11 +233,7 @@ void MoxValue::cloneHeap() {
         storeAscii(load<AdoptedText*>()->text);
         return;
     }
-    HeapText* source = load<HeapText*>();
-    const std::size_t unitSize = form == wideForm ? sizeof(char16_t) : sizeof(char);
-    HeapText* copy = HeapText::make(source->length, unitSize);
-    std::memcpy(copy->units<char>(), source->units<char>(), source->length * unitSize);
-    store(MOXVALUE_STRING, copy);
+    MoxMutex::interlockedIncrement(load<HeapText*>()->users);
 }
 
 void MoxValue::freeHeap() {
@@ -200,7 +242,14 @@ void MoxValue::freeHeap() {
     } else if (form == adoptedForm) {
         delete load<AdoptedText*>();
     } else {
-        std::free(load<HeapText*>());
+        releaseText();
+    }
+}
+
+void MoxValue::releaseText() {
+    auto* text = load<HeapText*>();
+    if (MoxMutex::interlockedDecrement(text->users) == 0) {
+        std::free(text);
     }
 }
 

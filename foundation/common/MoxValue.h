@@ -219,6 +219,7 @@ private:
 
     void cloneHeap();
     void freeHeap();
+    void releaseText();
     void storeText(std::u16string_view text);
     void storeAscii(std::string_view text);
     void storeWide(std::u16string_view text);

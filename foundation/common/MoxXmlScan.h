@@ -6,6 +6,8 @@
 
 #if defined(__SSE2__)
 #include <bit>
+#include <cstdint>
+#include <cstring>
 #include <emmintrin.h>
 #endif
 
@@ -21,19 +23,34 @@ constexpr bool mayBeXmlMarkup(char c) {
 #if defined(__SSE2__)
 
 /// Returns: a bit for each of sixteen characters, set as `mayBeXmlMarkup` says.
-inline unsigned int findXmlMarkupOfSixteen(const char* text) {
+inline unsigned int findXmlMarkupOfSixteen(__m128i text) {
     const auto equals = [](__m128i block, char c) {
         return _mm_cmpeq_epi8(block, _mm_set1_epi8(c));
     };
-    const __m128i block = _mm_loadu_si128(reinterpret_cast<const __m128i*>(text));
     const __m128i lastControl = _mm_set1_epi8(0x1F);
     // '<' and '>' differ in one bit.
-    const __m128i angle = equals(_mm_or_si128(block, _mm_set1_epi8('<' ^ '>')), '<' | '>');
-    const __m128i control = _mm_cmpeq_epi8(_mm_max_epu8(block, lastControl), lastControl);
+    const __m128i angle = equals(_mm_or_si128(text, _mm_set1_epi8('<' ^ '>')), '<' | '>');
+    const __m128i control = _mm_cmpeq_epi8(_mm_max_epu8(text, lastControl), lastControl);
     const __m128i other =
-        _mm_or_si128(_mm_or_si128(equals(block, '&'), equals(block, '"')), equals(block, '\x7F'));
+        _mm_or_si128(_mm_or_si128(equals(text, '&'), equals(text, '"')), equals(text, '\x7F'));
     const __m128i found = _mm_or_si128(_mm_or_si128(angle, control), other);
     return static_cast<unsigned int>(_mm_movemask_epi8(found));
+}
+
+/// Returns: whether `mayBeXmlMarkup` says no to all of `count` characters, 4 to 16.
+inline bool isFreeOfXmlMarkup(const char* text, std::size_t count) {
+    if (count >= 8) { // the halves may overlap
+        const __m128i first = _mm_loadl_epi64(reinterpret_cast<const __m128i*>(text));
+        const __m128i last = _mm_loadl_epi64(reinterpret_cast<const __m128i*>(text + count - 8));
+        return findXmlMarkupOfSixteen(_mm_unpacklo_epi64(first, last)) == 0;
+    }
+    std::int32_t first = 0;
+    std::int32_t last = 0;
+    std::memcpy(&first, text, sizeof(first));
+    std::memcpy(&last, text + count - sizeof(last), sizeof(last));
+    const __m128i four = _mm_unpacklo_epi32(_mm_cvtsi32_si128(first), _mm_cvtsi32_si128(last));
+    constexpr unsigned int eight = 0xFF;
+    return (findXmlMarkupOfSixteen(four) & eight) == 0;
 }
 
 #endif
@@ -44,10 +61,15 @@ inline std::size_t findXmlMarkup(std::string_view text, std::size_t i) {
 #if defined(__SSE2__)
     constexpr std::size_t blockSize = 16;
     for (; i + blockSize <= text.size(); i += blockSize) {
-        const unsigned int found = findXmlMarkupOfSixteen(text.data() + i);
+        const unsigned int found = findXmlMarkupOfSixteen(
+            _mm_loadu_si128(reinterpret_cast<const __m128i*>(text.data() + i)));
         if (found != 0) {
             return i + static_cast<std::size_t>(std::countr_zero(found));
         }
+    }
+    const std::size_t rest = text.size() - i;
+    if (i < text.size() && rest >= 4 && isFreeOfXmlMarkup(text.data() + i, rest)) {
+        return text.size();
     }
 #endif
     while (i < text.size() && !mayBeXmlMarkup(text[i])) {

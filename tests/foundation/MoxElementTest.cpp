@@ -33,7 +33,7 @@ protected:
     MoxPtr<MoxElement> element = document->createElement(MoxName(u"rect"));
 };
 
-TEST_F(MoxElementTest, IsSmall) { EXPECT_LE(sizeof(MoxElement), 88U); }
+TEST_F(MoxElementTest, IsSmall) { EXPECT_LE(sizeof(MoxElement), 80U); }
 
 TEST_F(MoxElementTest, HasTheNamesItWasMadeWith) {
     EXPECT_EQ(element->getNodeName(), MoxName(u"rect"));
@@ -190,6 +190,19 @@ TEST_F(MoxElementTest, HasRoomForManyAttributesAndRefusesMoreUnharmed) {
     element->removeAttribute(MoxName::fromNumber(0x10000000U));
     element->setAttribute(x, 1);
     EXPECT_EQ(element->getAttributes().item(most - 1).getNodeName(), x);
+}
+
+TEST_F(MoxElementTest, RoomForAttributesIsNoAttribute) {
+    element->reserveAttributes(2);
+    EXPECT_EQ(element->getAttributes().getLength(), 0);
+    element->setAttribute(x, 1);
+    element->reserveAttributes(100);
+    element->reserveAttributes(-1);
+    EXPECT_EQ(element->getAttribute(x), MoxValue(1));
+    for (int i = 0; i < 5; ++i) {
+        element->setAttribute(MoxName::fromNumber(0x10000000U + i), i);
+    }
+    EXPECT_EQ(element->getAttributes().getLength(), 6);
 }
 
 } // namespace

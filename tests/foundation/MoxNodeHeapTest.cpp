@@ -56,7 +56,7 @@ void releaseAll(const std::vector<Block>& blocks) {
 TEST(MoxNodeHeap, BlocksAreAlignedAndDoNotOverlap) {
     const std::vector<Block> blocks = allocateMany(5000);
     for (const Block& block : blocks) {
-        EXPECT_EQ(reinterpret_cast<std::uintptr_t>(block.memory) % 16, 0U);
+        EXPECT_EQ(reinterpret_cast<std::uintptr_t>(block.memory) % 8, 0U);
         EXPECT_TRUE(block.isIntact());
     }
     releaseAll(blocks);
@@ -93,6 +93,20 @@ TEST(MoxNodeHeap, ANewestBlockThatIsReleasedIsUsedAgain) {
         EXPECT_EQ(first, second);
     }
     MoxNodeHeap::release(second, 96);
+}
+
+TEST(MoxNodeHeap, WhatIsAllReleasedIsCutAgainFromTheBeginning) {
+    std::vector<Block> blocks = allocateMany(20);
+    void* first = blocks.front().memory;
+    std::vector<Block> others = allocateMany(20);
+    releaseAll(others);
+    releaseAll(blocks);
+    void* second = MoxNodeHeap::allocate(16);
+    if (cutsBlocks) {
+        EXPECT_LE(reinterpret_cast<std::uintptr_t>(second),
+                  reinterpret_cast<std::uintptr_t>(first));
+    }
+    MoxNodeHeap::release(second, 16);
 }
 
 TEST(MoxNodeHeap, ReleasingNothingDoesNothing) { MoxNodeHeap::release(nullptr, 0); }
