@@ -245,4 +245,13 @@ MoxPtr<SVGElement> DrawmereImpl::createElement(SVGName name) const {
     return treeManager->document->createSVGElement(name);
 }
 
+MoxPtr<SVGElement> DrawmereImpl::createDrawing(SVGName name, int geometry, PAINTMODE mode) const {
+    MoxPtr<SVGElement> element = createElement(name);
+    const bool isStroked = (mode & PAINTMODE_STROKE) != 0;
+    const bool isMoved =
+        !SVGGraphicContext::IsUnitMatrix(getGContext()->getCurrentGC()->transMatrix);
+    element->reserveAttributes(geometry + 1 + (isStroked ? 1 : 0) + (isMoved ? 1 : 0));
+    return element;
+}
+
 } // namespace DrawmereNS

@@ -255,6 +255,8 @@ public:
 protected:
     /// Returns: a new element of the document that stands nowhere yet.
     MoxPtr<SVGElement> createElement(SVGName name) const;
+    /// The same with room for `geometry` attributes, and for those of the paint and the matrix.
+    MoxPtr<SVGElement> createDrawing(SVGName name, int geometry, PAINTMODE mode) const;
 
     /// Queues the text of `code`, one of 16428 to 16431, when the output is to be Tiny.
     void warnUnderTiny(unsigned short code) const;

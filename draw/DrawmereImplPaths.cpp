@@ -76,7 +76,7 @@ void DrawmereImpl::endPathData(PAINTMODE mode) {
     if (data.getType() == MoxCommonNS::MOXVALUE_NULL) {
         return;
     }
-    const MoxPtr<SVGElement> path = createElement(SVGName::path);
+    const MoxPtr<SVGElement> path = createDrawing(SVGName::path, 1, mode);
     path->setSVGAttribute(SVGName::d, std::move(data));
     groupManager->setElemMode(mode, ELEMENTTYPE_SHAPE);
     setPaintAttr(path.get(), mode);

@@ -19,7 +19,7 @@ void appendReal(std::string& text, float number, char separator) {
 
 void DrawmereImpl::drawRect(MoxLength x, MoxLength y, MoxLength width, MoxLength height,
                             MoxLength rx, MoxLength ry, PAINTMODE mode) {
-    const MoxPtr<SVGElement> rect = createElement(SVGName::rect);
+    const MoxPtr<SVGElement> rect = createDrawing(SVGName::rect, 4, mode);
     setLength(*rect, SVGName::x, x);
     setLength(*rect, SVGName::y, y);
     if (rx.getRawValue() != 0.0F || ry.getRawValue() != 0.0F) {
@@ -32,7 +32,7 @@ void DrawmereImpl::drawRect(MoxLength x, MoxLength y, MoxLength width, MoxLength
 }
 
 void DrawmereImpl::drawCircle(MoxLength cx, MoxLength cy, MoxLength r, PAINTMODE mode) {
-    const MoxPtr<SVGElement> circle = createElement(SVGName::circle);
+    const MoxPtr<SVGElement> circle = createDrawing(SVGName::circle, 3, mode);
     setLength(*circle, SVGName::cx, cx);
     setLength(*circle, SVGName::cy, cy);
     setLength(*circle, SVGName::r, r);
@@ -41,7 +41,7 @@ void DrawmereImpl::drawCircle(MoxLength cx, MoxLength cy, MoxLength r, PAINTMODE
 
 void DrawmereImpl::drawEllipse(MoxLength cx, MoxLength cy, MoxLength rx, MoxLength ry,
                                PAINTMODE mode) {
-    const MoxPtr<SVGElement> ellipse = createElement(SVGName::ellipse);
+    const MoxPtr<SVGElement> ellipse = createDrawing(SVGName::ellipse, 4, mode);
     setLength(*ellipse, SVGName::cx, cx);
     setLength(*ellipse, SVGName::cy, cy);
     setLength(*ellipse, SVGName::rx, rx);
@@ -51,7 +51,7 @@ void DrawmereImpl::drawEllipse(MoxLength cx, MoxLength cy, MoxLength rx, MoxLeng
 
 void DrawmereImpl::drawLine(MoxLength x1, MoxLength y1, MoxLength x2, MoxLength y2,
                             PAINTMODE mode) {
-    const MoxPtr<SVGElement> line = createElement(SVGName::line);
+    const MoxPtr<SVGElement> line = createDrawing(SVGName::line, 4, mode);
     setLength(*line, SVGName::x1, x1);
     setLength(*line, SVGName::y1, y1);
     setLength(*line, SVGName::x2, x2);
@@ -65,7 +65,8 @@ void DrawmereImpl::drawPoly(float* coordinates, int count, bool open, PAINTMODE 
         appendReal(points, coordinates[i], ',');
         appendReal(points, coordinates[i + 1], ' ');
     }
-    const MoxPtr<SVGElement> poly = createElement(open ? SVGName::polyline : SVGName::polygon);
+    const MoxPtr<SVGElement> poly =
+        createDrawing(open ? SVGName::polyline : SVGName::polygon, 1, mode);
     setPaintAttr(poly.get(), mode);
     // On purpose: the points stand behind the paint and end in a blank. Other shapes have their
     // geometry first.

@@ -90,7 +90,7 @@ void DrawmereImpl::drawText(const UnicodeString& text, const std::vector<MoxLeng
     if (text.isEmpty()) {
         return;
     }
-    const MoxPtr<SVGElement> element = createElement(SVGName::text);
+    const MoxPtr<SVGElement> element = createDrawing(SVGName::text, 2, mode);
     setPositions(*element, SVGName::x, x);
     setPositions(*element, SVGName::y, y);
     if (!leftToRight) {

@@ -298,8 +298,10 @@ void Drawmere::drawText(const UnicodeString& text, const std::vector<MoxLength>&
 
 void Drawmere::drawText(const UnicodeString& text, MoxLength x, MoxLength y, PAINTMODE mode,
                         TLStringWithGlyphInfo* glyphs, bool wholeRun, bool leftToRight) {
-    drawText(text, std::vector<MoxLength>{x}, std::vector<MoxLength>{y}, std::vector<float>{0.0F},
-             mode, glyphs, wholeRun, leftToRight);
+    oneX.assign(1, x);
+    oneY.assign(1, y);
+    noRotation.assign(1, 0.0F);
+    drawText(text, oneX, oneY, noRotation, mode, glyphs, wholeRun, leftToRight);
 }
 
 void Drawmere::drawImage(TLGraphicImage* image, TLGraphicType /*type*/, const MoxLength& width,

@@ -349,6 +349,11 @@ private:
         std::vector<MoxPtr<MoxCommonNS::MoxElement>> anchors = {};
     };
 
+    // The lists of a text with one position, kept from one to the next.
+    std::vector<MoxLength> oneX;
+    std::vector<MoxLength> oneY;
+    std::vector<float> noRotation;
+
     bool hasWrittenFile = false; ///< under the number of its page
     std::map<std::int32_t, KeptPage> keptPages;
 };

@@ -70,14 +70,18 @@ MoxValue makeFontWeightValue(FONTWEIGHT weight) {
     return MoxValue::fromAscii({text, MoxCommonNS::writeInteger(weight, text)});
 }
 
-const char16_t* getFontStyleWord(FSTYLE style) { return orNormal(findWord(styleWords, style)); }
+const char16_t* findFontStyleWord(FSTYLE style) { return findWord(styleWords, style); }
+
+const char16_t* findFontStretchWord(FONTSTRECH stretch) { return findWord(stretchWords, stretch); }
+
+const char16_t* getFontStyleWord(FSTYLE style) { return orNormal(findFontStyleWord(style)); }
 
 const char16_t* getFontVariantWord(FVARIANT variant) {
     return orNormal(findWord(variantWords, variant));
 }
 
 const char16_t* getFontStretchWord(FONTSTRECH stretch) {
-    return orNormal(findWord(stretchWords, stretch));
+    return orNormal(findFontStretchWord(stretch));
 }
 
 } // namespace DrawmereNS

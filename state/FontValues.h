@@ -19,6 +19,12 @@ MoxValue makeFontAdjustValue(MoxLength adjust);
 /// Returns: the number of the weight, or "normal" for a number that is none.
 MoxValue makeFontWeightValue(FONTWEIGHT weight);
 
+/// Returns: the word of a style that is not normal, otherwise null.
+const char16_t* findFontStyleWord(FSTYLE style);
+
+/// Returns: the word of a width that is not normal, otherwise null.
+const char16_t* findFontStretchWord(FONTSTRECH stretch);
+
 // The words of a style, a variant and a width, "normal" for numbers that are not listed.
 
 const char16_t* getFontStyleWord(FSTYLE style);

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "SVGConfig.h"
+#include "foundation/common/MoxValue.h"
 #include "state/GraphicContext.h"
 
 #include <map>
@@ -226,10 +227,13 @@ private:
     bool isBeyondProfile(const SVGMatrix& m) const;
     UnicodeString getColorText(const MoxColor& color) const;
     void writeStrokeDifferences(SVGElement* element, bool isGroup) const;
-    void writeTextDifferences(SVGElement* element, bool isGroup) const;
-    void writeFont(SVGElement* group, const SVGFont& font) const;
+    void writeTextDifferences(SVGElement* element, bool isGroup);
+    void writeFont(SVGElement* group, const SVGFont& font);
+    const MoxCommonNS::MoxValue& getFamilyValue(const UnicodeString& family);
     void moveCurrentToGroup();
     void writeClip(SVGElement* element);
+
+    MoxCommonNS::MoxValue lastFamily; ///< written; the groups of one family share its text
 };
 
 } // namespace DrawmereNS

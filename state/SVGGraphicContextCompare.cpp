@@ -3,7 +3,7 @@
 #include "foundation/common/MoxNameTable.h"
 #include "state/FontValues.h"
 #include "state/SVGGraphicContext.h"
-#include "tree/SVGUtil.h"
+#include "tree/SVGElement.h"
 
 #include <algorithm>
 #include <string_view>
@@ -18,23 +18,27 @@ using MoxCommonNS::MoxNode;
 using MoxCommonNS::MoxValueType;
 using MoxCommonNS::narrow;
 
-SVGName nameOf(const MoxNode* node) { return SVGUtil::getSVGLocalName(narrow<MoxElement>(node)); }
+SVGName nameOf(const MoxElement& element) { return SVGName(element.localLink()); }
+
+SVGName nameOf(const MoxNode* node) {
+    const bool isElement = node && node->kindLink() == MoxCommonNS::MOXNODE_ELEMENT;
+    return isElement ? nameOf(static_cast<const MoxElement&>(*node)) : SVGName();
+}
 
 bool isTextOrGroup(SVGName name) { return name == SVGName::text || name == SVGName::g; }
 
 /// The level of matrix that an element takes by where it stands: a closing group under the root
 /// takes the root's, any other closing group its own, and what stands in an open group the current.
 TRANSFORMMODE findTransformMode(const SVGElement& element, SVGName name) {
-    if (nameOf(element.getParentNode()) == SVGName::svg) {
+    if (nameOf(element.parentLink()) == SVGName::svg) {
         return TRANSFORMMODE_ROOT;
     }
-    const bool isContainer = element.hasChildNodes() && name != SVGName::text;
+    const bool isContainer = element.firstLink() && name != SVGName::text;
     return isContainer ? TRANSFORMMODE_GROUP : TRANSFORMMODE_CURRENT;
 }
 
 bool closesAroundText(const SVGElement& element) {
-    return SVGUtil::getSVGLocalName(&element) == SVGName::g &&
-           nameOf(element.getFirstChild()) == SVGName::text;
+    return nameOf(element) == SVGName::g && nameOf(element.firstLink()) == SVGName::text;
 }
 
 MoxElement* findRoot(const SVGElement& element) {
@@ -75,6 +79,13 @@ bool rootTakesFamily(MoxElement* root, const UnicodeString& family) {
     return saysFamily(root->getAttribute(SVGName(SVGName::font_family)), family);
 }
 
+/// Writes a word; null, for what is normal, writes nothing.
+void writeWord(SVGElement* element, SVGName name, const char16_t* word) {
+    if (word) {
+        element->setSVGAttribute(name, MoxValue(word));
+    }
+}
+
 void writeUnlessNormal(SVGElement* element, SVGName name, MoxValue&& value) {
     if (value.getAsciiText() != "normal") {
         element->setSVGAttribute(name, std::move(value));
@@ -91,7 +102,7 @@ void SVGGraphicContext::AttrValueCompare(SVGElement* element, bool isGroup, ELEM
     if (!element) {
         return;
     }
-    const SVGName name = SVGUtil::getSVGLocalName(element);
+    const SVGName name = nameOf(*element);
     setTransformAttr(element, findTransformMode(*element, name));
     if (kind == ELEMENTTYPE_SHAPE || kind == ELEMENTTYPE_TEXT) {
         writeStrokeDifferences(element, isGroup);
@@ -107,7 +118,9 @@ void SVGGraphicContext::AttrValueCompare(SVGElement* element, bool isGroup, ELEM
     if (!isTiny() && levels.subject.maskReference != levels.reference.maskReference) {
         element->setSVGAttribute(SVGName::mask, MoxValue(levels.subject.maskReference));
     }
-    setOpacityAttribute(element, OPACITYDEST_ELEMENT, isGroup, /*asOpacity=*/false);
+    if (levels.subject.opacity != levels.reference.opacity) {
+        setOpacityAttribute(element, OPACITYDEST_ELEMENT, isGroup, /*asOpacity=*/false);
+    }
 }
 
 void SVGGraphicContext::writeStrokeDifferences(SVGElement* element, bool isGroup) const {
@@ -124,24 +137,28 @@ void SVGGraphicContext::writeStrokeDifferences(SVGElement* element, bool isGroup
     if (subject.miterLimit != reference.miterLimit) {
         setStrokeAttribute(element, ATTRIBUTEFLAG_MITERLIMIT, isGroup);
     }
-    setOpacityAttribute(element, OPACITYDEST_STROKE, isGroup, /*asOpacity=*/false);
+    if (subject.strokeOpacity != reference.strokeOpacity) {
+        setOpacityAttribute(element, OPACITYDEST_STROKE, isGroup, /*asOpacity=*/false);
+    }
     if (subject.dashOffset != reference.dashOffset) {
         setStrokeAttribute(element, ATTRIBUTEFLAG_DASHOFFSET, isGroup);
     }
     if (subject.dashArray != reference.dashArray) {
         setStrokeAttribute(element, ATTRIBUTEFLAG_DASHARRAY, isGroup);
     }
-    setOpacityAttribute(element, OPACITYDEST_FILL, isGroup, /*asOpacity=*/false);
+    if (subject.fillOpacity != reference.fillOpacity) {
+        setOpacityAttribute(element, OPACITYDEST_FILL, isGroup, /*asOpacity=*/false);
+    }
 }
 
-void SVGGraphicContext::writeTextDifferences(SVGElement* element, bool isGroup) const {
+void SVGGraphicContext::writeTextDifferences(SVGElement* element, bool isGroup) {
     const auto& [subject, reference] = getLevels(isGroup);
     if (closesAroundText(*element)) {
         writeFont(element, subject.font);
     }
     // On purpose: word spacing is compared with the default, so each text of a group that has one
     // carries it; compared with the group, the first text would lose it.
-    if (!isTiny() && SVGUtil::getSVGLocalName(element) == SVGName::text &&
+    if (!isTiny() && nameOf(*element) == SVGName::text &&
         subject.wordSpacing != getDefaultGC().wordSpacing) {
         const float spacing = subject.wordSpacing.getRealValue(MoxCommonNS::MOXUNIT_POINT);
         element->setSVGAttribute(SVGName::word_spacing, MoxValue(spacing));
@@ -157,16 +174,24 @@ void SVGGraphicContext::writeTextDifferences(SVGElement* element, bool isGroup) 
     }
 }
 
-void SVGGraphicContext::writeFont(SVGElement* group, const SVGFont& font) const {
+const MoxValue& SVGGraphicContext::getFamilyValue(const UnicodeString& family) {
+    if (lastFamily.getType() != MoxValueType::MOXVALUE_STRING ||
+        !saysText(lastFamily, viewOf(family))) {
+        lastFamily = MoxValue(family);
+    }
+    return lastFamily;
+}
+
+void SVGGraphicContext::writeFont(SVGElement* group, const SVGFont& font) {
     // On purpose: the first text group gives its family to the root and carries none itself.
     if (!rootTakesFamily(findRoot(*group), font.fontFamily)) {
-        group->setSVGAttribute(SVGName::font_family, MoxValue(font.fontFamily));
+        group->setSVGAttribute(SVGName::font_family, getFamilyValue(font.fontFamily));
     }
     group->setSVGAttribute(SVGName::font_size, makeFontSizeValue(font.fontSize));
-    writeUnlessNormal(group, SVGName::font_style, getFontStyleWord(font.fontStyle));
+    writeWord(group, SVGName::font_style, findFontStyleWord(font.fontStyle));
     writeUnlessNormal(group, SVGName::font_weight, makeFontWeightValue(font.fontWeight));
     if (!isTiny()) {
-        writeUnlessNormal(group, SVGName::font_stretch, getFontStretchWord(font.fontStretch));
+        writeWord(group, SVGName::font_stretch, findFontStretchWord(font.fontStretch));
     }
 }
 

@@ -17,12 +17,14 @@ inline std::uint64_t loadUnits(const char16_t* units) {
 /// Compares by eight bytes: most texts are that short, and ICU's comparison is two calls.
 inline bool haveSameUnits(const char16_t* one, const char16_t* other, int count) {
     constexpr int unitsAtOnce = 4;
-    for (; count >= unitsAtOnce; count -= unitsAtOnce) {
-        if (loadUnits(one) != loadUnits(other)) {
-            return false;
+    if (count >= unitsAtOnce) {
+        const int last = count - unitsAtOnce; // the last eight may overlap those before
+        for (int i = 0; i < last; i += unitsAtOnce) {
+            if (loadUnits(one + i) != loadUnits(other + i)) {
+                return false;
+            }
         }
-        one += unitsAtOnce;
-        other += unitsAtOnce;
+        return loadUnits(one + last) == loadUnits(other + last);
     }
     for (; count > 0; --count) {
         if (*one++ != *other++) {
