@@ -22,13 +22,15 @@ References::References(const XmlReading& reading) {
 }
 
 void References::readElement(const XmlEvent& event, bool isInDefinitions) {
+    // An image lies in a file, whose name may begin in any way. What a definition uses for itself
+    // is never shown.
+    const bool isOutside = event.name == "image" || (event.name == "use" && isInDefinitions);
     for (const auto& [name, value] : event.attributes) {
         if (name == "id") {
             ids.insert(value);
         } else if (value.starts_with(urlStart)) {
             references.insert(value.substr(urlStart.size(), value.size() - urlStart.size() - 1));
-        } else if (name == "xlink:href" && value.starts_with('#') &&
-                   !(event.name == "use" && isInDefinitions)) {
+        } else if (name == "xlink:href" && value.starts_with('#') && !isOutside) {
             references.insert(value.substr(1));
         }
     }
