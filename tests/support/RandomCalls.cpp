@@ -270,6 +270,14 @@ constexpr void (*calls[])(RandomCalls& any, Drawmere& page) = {
     setTestFont,
 };
 
+/// What ends whatever may be open. They are called more often than their like, so that less is
+/// lost in a path or a gradient that nothing ends.
+constexpr void (*ends[])(RandomCalls& any, Drawmere& page) = {
+    call<&Drawmere::popState>, call<&Drawmere::endPathData>, call<&Drawmere::endClipDef>,
+    call<&Drawmere::endMask>,  call<&Drawmere::endPattern>,  call<&Drawmere::endGradiant>,
+    call<&Drawmere::endLink>,
+};
+
 constexpr void (*pathCalls[])(RandomCalls& any, Drawmere& page) = {
     call<&Drawmere::endPathData>,
     call<&Drawmere::setPathMoveTo>,
@@ -293,7 +301,7 @@ auto pickCall(RandomCalls& any, const DrawmereImpl& impl) {
     if (any.temper == RandomCalls::ORDERLY && !impl.treeManager->unlocked) {
         return any.pick(gradientCalls);
     }
-    return any.pick(calls);
+    return any.below(4) == 3 ? any.pick(ends) : any.pick(calls);
 }
 
 /// How a state is opened and how it ends.
