@@ -10,7 +10,7 @@
 
 // NOLINTBEGIN(bugprone-reserved-identifier): the names are those of the C library and the
 // sanitizer.
-#if defined(__SANITIZE_ADDRESS__)
+#if defined(DRAWMERE_SANITIZED)
 #define REAL(name) __interceptor_##name // NOLINT(cppcoreguidelines-macro-usage): it makes a name
 #else
 #define REAL(name) __libc_##name // NOLINT(cppcoreguidelines-macro-usage): it makes a name
