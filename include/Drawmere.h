@@ -67,9 +67,9 @@ using TalGraphic::TLGraphicType;
 /// Failures: drawing calls throw `MoxError`; `finishRootSvg` and `finish` hand theirs to the error
 /// handler; what a document survives goes to the queue of the configuration.
 /// Memory: without memory a call throws `std::bad_alloc`, and `finishRootSvg` and `finish` tell the
-/// handler, whose default throws it on. What that call should have drawn may be missing or half
-/// done; the object is as good as before, to go on with or to destroy. An image that there is no
-/// memory for is queued or thrown with one of the codes of images, a stream that has none for its
+/// handler, whose default throws it on. What the call should have drawn or written may be missing
+/// or half done; the object is fit to go on with or to destroy. An image that there is no memory
+/// for is queued or thrown with one of the codes of images, and a stream that has none for its
 /// buffer is one that can't be written.
 /// Threads: one object stays on one thread; two objects with their own configurations may run on
 /// two threads at once.

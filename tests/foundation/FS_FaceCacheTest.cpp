@@ -44,6 +44,17 @@ TEST(FS_FaceCache, KeepsABoundedCountOfFaces) {
     EXPECT_EQ(first.use_count(), 1);
 }
 
+TEST(FS_FaceCache, AFaceInUseStaysOpenWhenAllAreForgotten) {
+    FS_FaceCache cache;
+    const FS_FaceRequest request = makeRequest("Tiny");
+    const std::shared_ptr<FS_Face> face = cache.find(request);
+    ASSERT_NE(face, nullptr);
+    cache.clear();
+    EXPECT_EQ(cache.size(), 0U);
+    EXPECT_EQ(utf8(face->familyName), "Tiny");
+    EXPECT_NE(cache.find(request), face);
+}
+
 TEST(FS_FaceCache, KeepsABoundedSumOfBytesInMemory) {
     FS_FaceCache cache;
     const std::size_t half = FS_FaceCache::mostBytes / 2;
