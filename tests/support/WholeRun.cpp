@@ -228,7 +228,7 @@ void WholeRun::drawEmbeddedTexts(Drawmere& page) {
         SVGFont font = makeFont(uprightFace, /*byGlyphs=*/false);
         page.setFont(&font, &testFonts());
         page.setWritingMode(MoxName(u"tb-rl"));
-        page.drawText(u"A\x3042", pt(20), pt(30), PAINTMODE_FILL, nullptr, true, true);
+        page.drawText(u"A\xFF3B", pt(20), pt(30), PAINTMODE_FILL, nullptr, true, true);
         page.setWritingMode(MoxName(u"lr-tb"));
     });
 }
@@ -295,7 +295,7 @@ void WholeRun::drawGradients(Drawmere& page) {
 
 void WholeRun::drawLinks(Drawmere& page, int number) {
     step([&] {
-        page.startLink(number == 1 ? u"#an anchor on the page that follows" : u"#early",
+        page.startLink(number == 1 ? u"#an-anchor-on-the-page-that-follows" : u"#early",
                        MoxName(u"new"));
         page.drawCircle(pt(5), pt(5), pt(4), PAINTMODE_FILL);
         page.endLink();
@@ -306,9 +306,9 @@ void WholeRun::drawLinks(Drawmere& page, int number) {
         page.endLink();
     });
     step([&] {
-        page.setInternalLinkAnchor(number == 1 ? u"early" : u"an anchor on the page that follows",
+        page.setInternalLinkAnchor(number == 1 ? u"early" : u"an-anchor-on-the-page-that-follows",
                                    10, 20);
-        page.setInternalView(number == 1 ? u"view one" : u"the view of the second page", 1, 2, 3,
+        page.setInternalView(number == 1 ? u"view-one" : u"the-view-of-the-second-page", 1, 2, 3,
                              4);
     });
 }

@@ -87,7 +87,7 @@ private:
     void drawLinks(Drawmere& page, int number);
     void takeQueue(SVGConfig& config);
 
-    const RunOptions& options;
+    const RunOptions options;
     const bool stops;
     TempDir directory;
     UnicodeString path;

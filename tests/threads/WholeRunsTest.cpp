@@ -81,5 +81,41 @@ TEST(WholeRuns, TwoAtOnceWriteWhatEachWritesAlone) {
     }
 }
 
+/// Asks for fonts of the system by names that are no fonts, each once, and for some that are.
+std::string drawInSystemFonts(int run) {
+    constexpr int nameCount = 20;
+    std::ostringstream stream;
+    SVGConfig config;
+    SVGPageUri uri(u"page.svg");
+    Drawmere page(&config, &uri);
+    page.initRootSvg(&stream);
+    for (int i = 0; i < nameCount; ++i) {
+        const std::string name = i % 2 == 0 ? "serif" : "None " + std::to_string(run * 100 + i);
+        SVGFont font;
+        font.setFontAttribute(UnicodeString::fromUTF8(name), MoxLength::fromRaw(10),
+                              FONTWEIGHT_NORMAL, FSTYLE_NORMAL, u"", false);
+        font.setEmbedAttribute(/*embed=*/true, /*byGlyphIds=*/false);
+        page.setFont(&font, nullptr);
+        page.drawText(u"A", MoxLength(), MoxLength(), PAINTMODE_FILL, nullptr, true, true);
+    }
+    page.finishRootSvg();
+    page.finish();
+    return stream.str();
+}
+
+TEST(WholeRuns, TwoThreadsMayLookForFontsOfTheSystem) {
+    std::array<std::string, runCount> drawn;
+    std::array<std::thread, runCount> threads;
+    for (int run = 0; run < runCount; ++run) {
+        threads[run] = std::thread([run, &drawn] { drawn[run] = drawInSystemFonts(run); });
+    }
+    for (std::thread& thread : threads) {
+        thread.join();
+    }
+    for (int run = 0; run < runCount; ++run) {
+        EXPECT_EQ(drawn[run], drawInSystemFonts(run));
+    }
+}
+
 } // namespace
 } // namespace DrawmereTest
