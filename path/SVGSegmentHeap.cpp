@@ -1,32 +1,20 @@
 #include "path/SVGSegmentHeap.h"
 
+#include "foundation/common/MoxChunkMemory.h"
 #include "foundation/common/MoxMutex.h"
 
 #include <atomic>
-#include <cstdint>
 #include <cstdlib>
 #include <new>
 #include <sys/mman.h>
 
-#if defined(__has_feature)
-#if __has_feature(address_sanitizer) || __has_feature(thread_sanitizer)
-#define SEGMENTS_SANITIZED 1
-#endif
-#endif
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
-#define SEGMENTS_SANITIZED 1
-#endif
-
 namespace DrawmereNS {
 namespace {
 
+using MoxCommonNS::MoxChunkMemory;
 using MoxCommonNS::MoxMutex;
 
-#ifdef SEGMENTS_SANITIZED
-constexpr std::size_t largestBlock = 0;
-#else
-constexpr std::size_t largestBlock = 1024;
-#endif
+constexpr std::size_t largestBlock = MoxChunkMemory::isWatched ? 0 : 1024;
 
 /// Chunks stand at multiples of their size, so that a block finds its own, and the system can back
 /// each with one huge page. What is never cut takes up no memory.
@@ -40,15 +28,10 @@ struct alignas(16) Chunk {
     char* begin() { return reinterpret_cast<char*>(this + 1); }
 
     char* end() { return reinterpret_cast<char*>(this) + chunkSize; }
-
-    static Chunk* of(void* block) {
-        const std::size_t offset = reinterpret_cast<std::uintptr_t>(block) % chunkSize;
-        return reinterpret_cast<Chunk*>(static_cast<char*>(block) - offset);
-    }
 };
 
 constexpr std::size_t roundUp(std::size_t size) {
-    return (size + blockAlignment - 1) & ~(blockAlignment - 1);
+    return MoxChunkMemory::roundUp(size, blockAlignment);
 }
 
 /// Returns: how many users are left.
@@ -105,10 +88,7 @@ void Cutter::renew() {
     }
     const bool isFirst = !chunk;
     close();
-    void* memory = nullptr;
-    if (posix_memalign(&memory, chunkSize, chunkSize) != 0) {
-        throw std::bad_alloc();
-    }
+    void* memory = MoxChunkMemory::allocateChunk(chunkSize, chunkSize);
     if (!isFirst) {
         // A wish, for long paths: without it the chunk is made of small pages.
         static_cast<void>(madvise(memory, chunkSize, MADV_HUGEPAGE));
@@ -119,20 +99,12 @@ void Cutter::renew() {
     end = chunk->end();
 }
 
-void* allocateLarge(std::size_t size) {
-    void* block = std::malloc(size);
-    if (!block) {
-        throw std::bad_alloc();
-    }
-    return block;
-}
-
 } // namespace
 
 void* SVGSegmentHeap::allocate(std::size_t size) {
     const std::size_t rounded = roundUp(size);
     if (rounded > largestBlock) {
-        return allocateLarge(size);
+        return MoxChunkMemory::allocateBlock(size);
     }
     if (rounded > cutter.room()) {
         cutter.renew();
@@ -148,7 +120,7 @@ void SVGSegmentHeap::release(void* block, std::size_t size) {
         std::free(block);
         return;
     }
-    Chunk* chunk = Chunk::of(block);
+    Chunk* chunk = MoxChunkMemory::findChunk<Chunk>(block, chunkSize);
     if (drop(chunk) == 1 && chunk == cutter.chunk) {
         cutter.cursor = chunk->begin();
     }

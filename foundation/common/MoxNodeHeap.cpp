@@ -1,29 +1,16 @@
 #include "foundation/common/MoxNodeHeap.h"
 
+#include "foundation/common/MoxChunkMemory.h"
 #include "foundation/common/MoxMutex.h"
 
-#include <cstdint>
 #include <cstdlib>
 #include <new>
 #include <sys/mman.h>
 
-#if defined(__has_feature)
-#if __has_feature(address_sanitizer) || __has_feature(thread_sanitizer)
-#define MOX_SANITIZED 1
-#endif
-#endif
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
-#define MOX_SANITIZED 1
-#endif
-
 namespace MoxCommonNS {
 namespace {
 
-#ifdef MOX_SANITIZED
-constexpr std::size_t largestBlock = 0;
-#else
-constexpr std::size_t largestBlock = 2048;
-#endif
+constexpr std::size_t largestBlock = MoxChunkMemory::isWatched ? 0 : 2048;
 
 /// Chunks stand at multiples of this, so that a block finds its own.
 constexpr std::size_t chunkAlignment = 32768;
@@ -56,7 +43,7 @@ struct alignas(blockAlignment) Slab {
 };
 
 constexpr std::size_t roundUp(std::size_t size) {
-    return (size + blockAlignment - 1) & ~(blockAlignment - 1);
+    return MoxChunkMemory::roundUp(size, blockAlignment);
 }
 
 void drop(Slab* slab) {
@@ -77,19 +64,6 @@ int drop(Chunk* chunk) {
         std::free(chunk);
     }
     return 0;
-}
-
-void* allocateAligned(std::size_t alignment, std::size_t size) {
-    void* memory = nullptr;
-    if (posix_memalign(&memory, alignment, size) != 0) {
-        throw std::bad_alloc();
-    }
-    return memory;
-}
-
-Chunk* findChunk(void* block) {
-    const std::size_t offset = reinterpret_cast<std::uintptr_t>(block) % chunkAlignment;
-    return reinterpret_cast<Chunk*>(static_cast<char*>(block) - offset);
 }
 
 /// Where a thread cuts its next block.
@@ -162,7 +136,7 @@ void Cutter::openChunkOfSlab() {
         closeSlab();
     }
     if (!slab) {
-        void* memory = allocateAligned(slabSize, slabSize);
+        void* memory = MoxChunkMemory::allocateChunk(slabSize, slabSize);
         // A wish: without it the slab is made of small pages.
         static_cast<void>(madvise(memory, slabSize, MADV_HUGEPAGE));
         slab = static_cast<Slab*>(memory);
@@ -183,8 +157,8 @@ void Cutter::renew() {
         return;
     }
     closeSlab();
-    openChunk(static_cast<char*>(allocateAligned(chunkAlignment, chunkSize)), sizeof(Chunk),
-              nullptr);
+    openChunk(static_cast<char*>(MoxChunkMemory::allocateChunk(chunkAlignment, chunkSize)),
+              sizeof(Chunk), nullptr);
 }
 
 /// Cuts from the beginning again where nothing stands any longer, so that one document after
@@ -198,20 +172,12 @@ void Cutter::rewind() {
     chunksInRow = 0;
 }
 
-void* allocateLarge(std::size_t size) {
-    void* block = std::malloc(size);
-    if (!block) {
-        throw std::bad_alloc();
-    }
-    return block;
-}
-
 } // namespace
 
 void* MoxNodeHeap::allocate(std::size_t size) {
     const std::size_t rounded = roundUp(size);
     if (rounded > largestBlock) {
-        return allocateLarge(size);
+        return MoxChunkMemory::allocateBlock(size);
     }
     if (rounded > cutter.room()) {
         cutter.renew();
@@ -231,7 +197,7 @@ void MoxNodeHeap::release(void* block, std::size_t size) {
     if (cutter.isNewest(block, rounded)) {
         cutter.cursor -= rounded;
     }
-    Chunk* chunk = findChunk(block);
+    Chunk* chunk = MoxChunkMemory::findChunk<Chunk>(block, chunkAlignment);
     if (drop(chunk) == 1 && chunk == cutter.chunk) {
         cutter.rewind(); // the thread itself is its only user
     }
