@@ -60,10 +60,21 @@ public:
 
     /// Sets what links are solved with: whether all pages are in one document, the ids of all
     /// destinations, the page of each, and the file name of each page.
-    /// Borrows: the containers, which must outlive this object and may go on to grow.
+    /// Borrows: the containers, which must outlive this object and may go on to grow; none of them
+    /// may be a temporary.
     void setRefernceIdInfo(bool isSingleFile, const std::set<UnicodeString>& anchors,
                            const std::map<UnicodeString, int>& pagesOfAnchors,
                            const std::map<int, UnicodeString>& filesOfPages); // sic
+
+    void setRefernceIdInfo(bool, const std::set<UnicodeString>&&,
+                           const std::map<UnicodeString, int>&,
+                           const std::map<int, UnicodeString>&) = delete;
+    void setRefernceIdInfo(bool, const std::set<UnicodeString>&,
+                           const std::map<UnicodeString, int>&&,
+                           const std::map<int, UnicodeString>&) = delete;
+    void setRefernceIdInfo(bool, const std::set<UnicodeString>&,
+                           const std::map<UnicodeString, int>&,
+                           const std::map<int, UnicodeString>&&) = delete;
 
     bool singleFile = false;
     const std::set<UnicodeString>* allAnchors = nullptr;       ///< borrowed; not read here

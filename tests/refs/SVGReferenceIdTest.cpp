@@ -4,6 +4,7 @@
 #include "tests/support/Utf8.h"
 
 #include <gtest/gtest.h>
+#include <utility>
 
 using namespace DrawmereNS;
 using DrawmereTest::utf8;
@@ -152,6 +153,24 @@ TEST_F(SVGReferenceIdTest, BooksAreReadWhereTheyAre) {
     pages[u"later"] = 8;
     files[8] = u"out8.svg";
     EXPECT_TRUE(solver.isSolvedId(u"#later"));
+}
+
+template <typename Anchors, typename Pages, typename Files>
+constexpr bool canBorrow = requires(SVGReferenceId solver, Anchors&& anchors, Pages&& pages,
+                                    Files&& files) {
+    solver.setRefernceIdInfo(true, std::forward<Anchors>(anchors), std::forward<Pages>(pages),
+                             std::forward<Files>(files));
+};
+
+TEST_F(SVGReferenceIdTest, NoBookMayBeATemporary) {
+    using Anchors = std::set<UnicodeString>;
+    using Pages = std::map<UnicodeString, int>;
+    using Files = std::map<int, UnicodeString>;
+    EXPECT_TRUE((canBorrow<Anchors&, const Pages&, Files&>));
+    EXPECT_FALSE((canBorrow<Anchors, Pages&, Files&>));
+    EXPECT_FALSE((canBorrow<Anchors&, Pages, Files&>));
+    EXPECT_FALSE((canBorrow<Anchors&, Pages&, Files>));
+    EXPECT_FALSE((canBorrow<Anchors, Pages, Files>));
 }
 
 TEST_F(SVGReferenceIdTest, InOneFileEverythingIsSolvedAndNothingRewritten) {
