@@ -17,8 +17,11 @@ function(drawmere_add_example name)
     file(MAKE_DIRECTORY ${written})
     add_test(NAME examples.${name} COMMAND ${name} WORKING_DIRECTORY ${written})
     set_tests_properties(examples.${name} PROPERTIES FIXTURES_SETUP ${name} TIMEOUT 120)
-    drawmere_lint_example(${name} wellformed --noout)
-    drawmere_lint_example(${name} valid --noout --dtdvalidfpi "-//W3C//DTD SVG 1.1//EN")
+    # The validator says the same of the same bytes, whatever wrote them.
+    if(NOT DRAWMERE_SANITIZE)
+        drawmere_lint_example(${name} wellformed --noout)
+        drawmere_lint_example(${name} valid --noout --dtdvalidfpi "-//W3C//DTD SVG 1.1//EN")
+    endif()
     drawmere_add_example_for_profiles(${name})
 endfunction()
 
