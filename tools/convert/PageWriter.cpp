@@ -10,18 +10,22 @@
 namespace DrawmereConvert {
 namespace {
 
+#if defined(__SANITIZE_ADDRESS__)
+constexpr bool isSanitized = true; // which sets aside more than any machine has
+#else
+constexpr bool isSanitized = false;
+#endif
+
 /// Bounds what the process can ask for: as much again as the reader of the document may have, and
 /// some room for the program itself. What asks for more gets an exception.
 void limitMemory(std::size_t readerBytes) {
-#if !defined(__SANITIZE_ADDRESS__) // which sets aside more than any machine has
     constexpr rlim_t room = rlim_t{512} << 20U;
     rlimit limit = {};
-    if (readerBytes == 0 || getrlimit(RLIMIT_AS, &limit) != 0) {
+    if (isSanitized || readerBytes == 0 || getrlimit(RLIMIT_AS, &limit) != 0) {
         return;
     }
     limit.rlim_cur = std::min(limit.rlim_max, 2 * rlim_t{readerBytes} + room);
     setrlimit(RLIMIT_AS, &limit);
-#endif
 }
 
 } // namespace
