@@ -61,10 +61,16 @@ protected:
     int count = 0;
 };
 
+#if defined(__SANITIZE_ADDRESS__)
+constexpr unsigned usualSeeds = 150; // each takes ten times as long
+#else
+constexpr unsigned usualSeeds = 600;
+#endif
+
 /// Returns: how many seeds each profile has; the environment may ask for more.
 unsigned countSeeds() {
     const char* const wish = std::getenv("DRAWMERE_RANDOM_DOCUMENTS");
-    return wish ? static_cast<unsigned>(std::atoi(wish)) : 600;
+    return wish ? static_cast<unsigned>(std::atoi(wish)) : usualSeeds;
 }
 
 TEST_P(RandomDocuments, AreValidButForTheKnownFaults) {
