@@ -17,10 +17,19 @@ set(CMAKE_CXX_STANDARD 20)
 set(CMAKE_CXX_STANDARD_REQUIRED ON)
 set(CMAKE_CXX_EXTENSIONS OFF)
 
+# What ccache keeps stands in the user's home: without one it refuses to compile.
 find_program(CCACHE ccache)
 if(CCACHE AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
-    # Without these words a source that uses a precompiled header never hits the cache.
-    set(CMAKE_CXX_COMPILER_LAUNCHER env CCACHE_SLOPPINESS=pch_defines,time_macros ${CCACHE})
+    file(WRITE ${PROJECT_BINARY_DIR}/CMakeFiles/ccache.cpp "")
+    execute_process(COMMAND ${CCACHE} ${CMAKE_CXX_COMPILER} -c ccache.cpp -o ccache.o
+        WORKING_DIRECTORY ${PROJECT_BINARY_DIR}/CMakeFiles
+        RESULT_VARIABLE refusal
+        ERROR_QUIET
+    )
+    if(refusal EQUAL 0)
+        # Without these words a source that uses a precompiled header never hits the cache.
+        set(CMAKE_CXX_COMPILER_LAUNCHER env CCACHE_SLOPPINESS=pch_defines,time_macros ${CCACHE})
+    endif()
 endif()
 
 find_package(PkgConfig REQUIRED)
