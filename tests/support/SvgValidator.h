@@ -7,7 +7,7 @@
 #include <string>
 #include <vector>
 
-struct _xmlDtd; // libxml2's, which only the source includes
+struct _xmlDtd; // NOLINT(bugprone-reserved-identifier): libxml2's own, included by the source alone
 
 namespace DrawmereTest {
 
