@@ -119,13 +119,13 @@ TEST_F(ProgramRun, TwiceGivesTheSameBytes) {
 
 TEST_F(ProgramRun, QuietSaysNothingAndVerboseMore) {
     EXPECT_EQ(run({"--quiet"}), "");
-    const std::string input = Conversion::document("FillStrokeOrdering.pdf");
+    const std::string input = Conversion::document("coons-allflags-withfunction.pdf");
     const auto say = [&](const std::string& option) {
         return conversion.run({input, option, "-o", "out/"}).output;
     };
-    EXPECT_THAT(say("--verbose"), HasSubstr("page 1: 1 knockout group drawn as a plain one"));
+    EXPECT_THAT(say("--verbose"), HasSubstr("page 1: 1 shading drawn as an image"));
     EXPECT_THAT(say("--no-index"), Not(HasSubstr("page 1: ")));
-    EXPECT_THAT(say("--no-index"), HasSubstr("; 1 knockout group drawn as a plain one"));
+    EXPECT_THAT(say("--no-index"), HasSubstr("; 1 shading drawn as an image"));
 }
 
 TEST_F(ProgramRun, AStrangersIndexIsNotReplaced) {
