@@ -1,4 +1,5 @@
 #include "tests/convert/Conversion.h"
+#include "tests/convert/TinyPdf.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -34,6 +35,24 @@ TEST_F(LinkWriter, ThePlaceOfADestinationIsThatOfItsGroup) {
     EXPECT_THAT(conversion.directory.read("out/p2.svg"),
                 HasSubstr("<g transform=\"translate(124.802,125.798035)\">"
                           "<g transform=\"translate(0)\"><text id=\"dest-2-125-126\"/>"));
+}
+
+TEST_F(LinkWriter, AViewLiesWhereItsRectangleIsOnThePage) {
+    const std::string link = "<</Type/Annot/Subtype/Link/Rect[1 1 9 9]/Dest[";
+    const std::string places = " 0 R/FitR 10 20 40 90]>>"; // of objects 19 and 21
+    conversion.directory.write(
+        "a.pdf", TinyPdf()
+                     .addPage("", "/Annots[" + link + "19" + places + link + "21" + places + "]")
+                     .addPage("10 20 30 70 re f")
+                     .addPage("10 20 30 70 re f", "/Rotate 90/CropBox[10 10 150 90]")
+                     .write());
+    EXPECT_EQ(conversion.run({"a.pdf", "-o", "out/"}).status, 0);
+    EXPECT_THAT(conversion.directory.read("out/a1.svg"),
+                HasSubstr("<a xlink:href=\"a2.svg#view-2-10-10-30-70\">"));
+    EXPECT_THAT(conversion.directory.read("out/a2.svg"),
+                HasSubstr("<view viewBox=\"10 10 30 70\" id=\"view-2-10-10-30-70\"/>"));
+    EXPECT_THAT(conversion.directory.read("out/a3.svg"),
+                HasSubstr("<view viewBox=\"10 0 70 30\" id=\"view-3-10-0-70-30\"/>"));
 }
 
 TEST_F(LinkWriter, ALinkIsATransparentRectangle) {

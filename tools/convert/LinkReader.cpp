@@ -2,6 +2,8 @@
 
 #include "tools/convert/FitzCall.h"
 
+#include <mupdf/pdf.h>
+
 #include <algorithm>
 #include <array>
 #include <cctype>
@@ -29,25 +31,42 @@ void setPoint(int page, float x, float y, LinkDestination& destination) {
     appendNumber(destination.id, destination.y);
 }
 
-void setView(int page, const fz_link_dest& target, LinkDestination& destination) {
+/// Returns: the rectangle of a destination on its page. MuPDF takes points there, but leaves
+/// rectangles of PDF documents as they stand in the file.
+fz_rect placeView(fz_context* ctx, fz_document* document, int page, const fz_link_dest& target) {
+    fz_rect view = {target.x, target.y, target.x + target.w, target.y + target.h};
+    callFitz(ctx, [&] {
+        pdf_document* const pdf = pdf_specifics(ctx, document);
+        if (pdf) {
+            fz_rect box{};
+            fz_matrix matrix{};
+            pdf_page_obj_transform(ctx, pdf_lookup_page_obj(ctx, pdf, page), &box, &matrix);
+            view = fz_transform_rect(view, matrix);
+        }
+    });
+    return view;
+}
+
+void setView(int page, const fz_rect& view, LinkDestination& destination) {
     destination.isView = true;
-    destination.x = target.x;
-    destination.y = target.y;
-    destination.width = target.w;
-    destination.height = target.h;
+    destination.x = view.x0;
+    destination.y = view.y0;
+    destination.width = view.x1 - view.x0;
+    destination.height = view.y1 - view.y0;
     destination.id = u"view";
-    for (const float number :
-         {static_cast<float>(page + 1), target.x, target.y, target.w, target.h}) {
+    for (const float number : {static_cast<float>(page + 1), destination.x, destination.y,
+                               destination.width, destination.height}) {
         appendNumber(destination.id, number);
     }
 }
 
-LinkDestination toDestination(int page, const fz_link_dest& target) {
+LinkDestination toDestination(fz_context* ctx, fz_document* document, int page,
+                              const fz_link_dest& target) {
     LinkDestination destination;
     switch (target.type) {
     case FZ_LINK_DEST_FIT_R:
         if (target.w > 0 && target.h > 0) {
-            setView(page, target, destination);
+            setView(page, placeView(ctx, document, page, target), destination);
         }
         break;
     case FZ_LINK_DEST_XYZ:
@@ -85,7 +104,7 @@ PageLink toLink(fz_context* ctx, fz_document* document, const fz_link& link) {
     });
     if (isKnown && page >= 0) {
         result.page = page;
-        result.destination = toDestination(page, target);
+        result.destination = toDestination(ctx, document, page, target);
     }
     return result;
 }
