@@ -107,6 +107,19 @@ std::string findBytes(const std::string& svg, const std::string& type) {
     return bytes;
 }
 
+TEST(ImageWriter, AnImageIsNotMadeFinerThanItsMask) {
+    const std::string gray = "/BitsPerComponent 8/ColorSpace/DeviceGray";
+    PageSource source =
+        makeImage("200 0 0 100 0 0 cm /I Do", "/Width 1/Height 1/SMask 6 0 R" + gray, "\x10");
+    std::string mask;
+    for (int i = 0; i < 256 * 256; ++i) {
+        mask.push_back(static_cast<char>(i % 256));
+    }
+    source.objects.emplace_back("/Type/XObject/Subtype/Image/Width 256/Height 256" + gray, mask);
+    const std::string png = findBytes(DrawnPage(source).svg, "png");
+    EXPECT_EQ(png.substr(16, 8), std::string("\0\0\1\0\0\0\1\0", 8)); // width and height
+}
+
 TEST(ImageWriter, AJpegOfGreyOrRgbGoesThroughByteForByte) {
     const std::string path = Conversion::document("image-streams-small.pdf");
     std::ifstream stream(path, std::ios::binary);

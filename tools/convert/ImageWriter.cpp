@@ -26,16 +26,19 @@ constexpr int maxZoomedPixels = 2'000'000;
 constexpr MoxColor opaque{};
 
 /// Documents mean the pixels of a coarse image to be seen, where SVG viewers smooth them; larger
-/// squares in their place keep their edges.
-int findZoom(const fz_image& image, const fz_matrix& matrix) {
+/// squares in their place keep their edges. An image and its mask, if any, have the size of the
+/// larger.
+int findZoom(const fz_image& image, const fz_image* mask, const fz_matrix& matrix) {
+    const int width = mask ? std::max(image.w, mask->w) : image.w;
+    const int height = mask ? std::max(image.h, mask->h) : image.h;
     const float across = std::hypot(matrix.a, matrix.b) * pixelsPerPoint;
     const float down = std::hypot(matrix.c, matrix.d) * pixelsPerPoint;
     const float size =
-        std::max(across / static_cast<float>(image.w), down / static_cast<float>(image.h));
+        std::max(across / static_cast<float>(width), down / static_cast<float>(height));
     if (image.interpolate || !(size > 2)) {
         return 1;
     }
-    const double room = static_cast<double>(maxZoomedPixels) / image.w / image.h;
+    const double room = static_cast<double>(maxZoomedPixels) / width / height;
     const double zoom = std::min(
         {std::ceil(static_cast<double>(size)), std::sqrt(room), static_cast<double>(maxZoom)});
     return std::max(1, static_cast<int>(zoom));
@@ -64,7 +67,7 @@ ImageWriter::~ImageWriter() {
 
 void ImageWriter::draw(fz_image* image, fz_image* mask, const fz_matrix& matrix, float alpha,
                        COLORUSE use) {
-    place(findFile({image, mask, use, 0, findZoom(*image, matrix)}), matrix, alpha);
+    place(findFile({image, mask, use, 0, findZoom(*image, mask, matrix)}), matrix, alpha);
 }
 
 bool ImageWriter::isPhotograph(fz_image* image) const {
@@ -77,7 +80,8 @@ void ImageWriter::drawStencil(fz_image* image, const fz_matrix& matrix, const Mo
     const float alpha = static_cast<float>(color.getAlpha()) / 255.0F;
     MoxColor solid = color;
     solid.clearAlpha();
-    place(findFile({image, nullptr, COLORUSE_PICTURE, solid.getPacked(), findZoom(*image, matrix)}),
+    place(findFile({image, nullptr, COLORUSE_PICTURE, solid.getPacked(),
+                    findZoom(*image, nullptr, matrix)}),
           matrix, alpha);
 }
 
