@@ -25,7 +25,7 @@ void expectUnreadable(const std::string& bytes, const std::string& complaint) {
     EXPECT_THAT(conversion.list(), ElementsAre("a.pdf"));
 }
 
-TEST(BadInput, AnEmptyFileIsNoDocument) { expectUnreadable("", ""); }
+TEST(BadInput, AnEmptyFileIsNoDocument) { expectUnreadable("", "it is empty"); }
 
 TEST(BadInput, WhatIsNoDocumentIsSaid) {
     expectUnreadable("A letter to a friend.\n", "");
@@ -43,8 +43,21 @@ TEST(BadInput, AMissingFileIsSaid) {
     const CommandResult result = conversion.run({"none.pdf", "-o", "out/"});
     EXPECT_EQ(result.status, unreadable);
     EXPECT_THAT(result.output, HasSubstr("none.pdf: "));
-    EXPECT_EQ(conversion.run({"/", "-o", "out/"}).status, unreadable);
     EXPECT_THAT(conversion.list(), IsEmpty());
+}
+
+TEST(BadInput, WhatIsNoFileIsSaidAndNotWaitedFor) {
+    const Conversion conversion;
+    const auto say = [&](const std::string& input) {
+        const CommandResult result = conversion.run({input, "-o", "out/"});
+        EXPECT_EQ(result.status, unreadable);
+        return result.output;
+    };
+    EXPECT_EQ(say("/"), "/: it is a directory\n");
+    EXPECT_EQ(say("/dev/null"), "/dev/null: it is not a plain file\n");
+    conversion.runShell("mkfifo pipe");
+    EXPECT_EQ(say("pipe"), "pipe: it is not a plain file\n");
+    EXPECT_THAT(conversion.list(), ElementsAre("pipe"));
 }
 
 TEST(BadInput, TheOtherDocumentsAreConverted) {
@@ -115,6 +128,22 @@ TEST(BadInput, PathsThatCannotBeWrittenAreSaid) {
     const CommandResult result = conversion.run({"a.pdf", "-o", "/proc/nothing/x.svg"});
     EXPECT_EQ(result.status, 2);
     EXPECT_THAT(result.output, HasSubstr("a.pdf: /proc/nothing/: "));
+}
+
+TEST(BadInput, AFileThatCannotBeWrittenIsSaidByItsOwnName) {
+    const Conversion conversion;
+    conversion.directory.write("a.pdf", makePlainPdf(2));
+    conversion.runShell("mkdir -p out/a1.svg");
+    const CommandResult result = conversion.run({"a.pdf", "-o", "out/"});
+    EXPECT_EQ(result.status, incomplete);
+    EXPECT_THAT(result.output, HasSubstr("a.pdf: page 1: ./out/a1.svg: Is a directory\n"));
+    const std::string name = std::string(300, 'x') + ".svg";
+    for (const std::string option : {"--keep-number", "--single-file"}) {
+        const CommandResult tooLong = conversion.run({"a.pdf", option, "-o", "o/" + name});
+        EXPECT_EQ(tooLong.status, incomplete);
+        EXPECT_THAT(tooLong.output, HasSubstr("./o/xxx"));
+        EXPECT_THAT(tooLong.output, Not(HasSubstr(".drawmere-")));
+    }
 }
 
 /// Two plain pages and one that takes for ever between them.

@@ -5,6 +5,7 @@
 #include <CLI/CLI.hpp>
 
 #include <algorithm>
+#include <cmath>
 #include <map>
 #include <thread>
 
@@ -160,9 +161,29 @@ private:
         if (app.count("--index") > 0) {
             options.index = wantsIndex ? INDEXMODE_ALWAYS : INDEXMODE_NEVER;
         }
+        settleNumbers();
         settlePages();
+        settleInputs();
         settleProfile();
         settlePlace();
+    }
+
+    void settleNumbers() {
+        if (!std::isfinite(options.timeout)) {
+            throw CLI::ValidationError("--timeout", "that is no number of seconds");
+        }
+        if (options.numberFormat.find('/') != std::string::npos) {
+            throw CLI::ValidationError("--number-format", "a slash can't be part of a name");
+        }
+    }
+
+    void settleInputs() {
+        const std::vector<std::string>& inputs = options.inputs;
+        for (auto input = inputs.begin(); input != inputs.end(); ++input) {
+            if (std::find(inputs.begin(), input, *input) != input) {
+                throw CLI::ValidationError("FILE", *input + " is given twice");
+            }
+        }
     }
 
     void settlePages() {

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <filesystem>
 #include <new>
 
 #include <malloc.h> // malloc_usable_size is no part of standard C++
@@ -26,6 +27,25 @@ bool keepsFile(fz_context* ctx, const char* name) {
         }
     }
     return false;
+}
+
+/// Throws: ConvertError for what only says of itself that it can't be read as a document, or waits
+/// for another program to write. What is not there is left for the reader to say.
+void checkKind(const std::string& path) {
+    namespace fs = std::filesystem;
+    std::error_code failure;
+    const fs::file_status status = fs::status(path, failure);
+    if (!fs::exists(status)) {
+        return;
+    }
+    if (!fs::is_regular_file(status)) {
+        throw ConvertError(CONVERTERROR_UNREADABLE, fs::is_directory(status)
+                                                        ? "it is a directory"
+                                                        : "it is not a plain file");
+    }
+    if (fs::file_size(path, failure) == 0) {
+        throw ConvertError(CONVERTERROR_UNREADABLE, "it is empty");
+    }
 }
 
 fz_document* openShared(fz_context* ctx, const char* name) {
@@ -66,6 +86,7 @@ void DocumentFile::open(const std::string& path, const std::string& password) {
 }
 
 void DocumentFile::openDocument(const std::string& path) {
+    checkKind(path);
     const char* name = path.c_str();
     if (!callFitz(ctx, [&] {
             fz_register_document_handlers(ctx);

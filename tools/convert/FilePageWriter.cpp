@@ -34,6 +34,7 @@ PageOutcome FilePageWriter::write(int page) {
         clearRoom();
     }
     takeErrors(config, outcome);
+    outcome.error = job.files->nameOutside(outcome.error, room);
     return outcome;
 }
 

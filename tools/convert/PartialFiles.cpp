@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cerrno>
 #include <filesystem>
+#include <stdexcept>
 #include <system_error>
 
 #include <stdlib.h> // mkdtemp is no part of standard C++
@@ -41,7 +42,19 @@ std::string PartialFiles::nameInside(std::string name) {
 }
 
 void PartialFiles::moveOut(const std::string& from, const std::string& name) const {
-    fs::rename(from, target + name);
+    std::error_code failure;
+    fs::rename(from, target + name, failure);
+    if (failure) {
+        throw std::runtime_error(target + name + ": " + failure.message());
+    }
+}
+
+std::string PartialFiles::nameOutside(std::string text, const std::string& room) const {
+    for (std::size_t at = text.find(room); at != std::string::npos;
+         at = text.find(room, at + target.size())) {
+        text.replace(at, room.size(), target);
+    }
+    return text;
 }
 
 } // namespace DrawmereConvert

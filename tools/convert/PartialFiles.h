@@ -27,8 +27,11 @@ public:
     static std::string nameInside(std::string name);
 
     /// Moves the file `from` to `name` in the target, in place of one that was there.
-    /// Throws: std::filesystem::filesystem_error.
+    /// Throws: std::runtime_error, with the file's own name.
     void moveOut(const std::string& from, const std::string& name) const;
+
+    /// Returns: `text` with the files of a room under the names that they get outside.
+    std::string nameOutside(std::string text, const std::string& room) const;
 
 private:
     std::string target;

@@ -44,8 +44,15 @@ PageOutcome WholeDocumentWriter::write(int page) {
     } catch (const std::exception& error) {
         noteFault(outcome, error);
     }
-    takeErrors(config, outcome);
+    sayErrors(outcome);
     return outcome;
+}
+
+void WholeDocumentWriter::sayErrors(PageOutcome& outcome) {
+    takeErrors(config, outcome);
+    if (job.files) {
+        outcome.error = job.files->nameOutside(outcome.error, room);
+    }
 }
 
 void WholeDocumentWriter::open() {
@@ -80,7 +87,7 @@ PageOutcome WholeDocumentWriter::finish() {
     } catch (const std::exception& error) {
         noteFault(outcome, error);
     }
-    takeErrors(config, outcome);
+    sayErrors(outcome);
     return outcome;
 }
 

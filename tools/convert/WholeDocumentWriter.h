@@ -17,6 +17,7 @@ public:
     PageOutcome finish() override;
 
 private:
+    void sayErrors(PageOutcome& outcome);
     void open();
     void drawPage(int page, PageOutcome& outcome);
     void save();
