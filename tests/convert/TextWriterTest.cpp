@@ -175,8 +175,8 @@ TEST(TextWriter, OutlinesThatOverlapFillByTheirOwnRule) {
 }
 
 TEST(TextWriter, WordsThatAreEquallyFarApartNeedOnePosition) {
-    const DrawnPage page = drawText("[(an) -500 (old) -1000 (one)] TJ", TEXTMODE_FONTS);
-    EXPECT_EQ(page.texts(), std::vector<std::string>{"an old  one"});
+    const DrawnPage page = drawText("[(an) -500 (old) -500 (one)] TJ", TEXTMODE_FONTS);
+    EXPECT_EQ(page.texts(), std::vector<std::string>{"an old one"});
     // Ten points, less the blank of the font.
     EXPECT_EQ(findText(page), "<text x=\"10\" y=\"60\" word-spacing=\"4.44\">");
     EXPECT_THAT(page.svg, HasSubstr("<glyph unicode=\" \" d=\"\""));
@@ -199,6 +199,29 @@ TEST(TextWriter, AProfileWithoutWordSpacingGetsPositions) {
     const DrawnPage page({"BT /F 20 Tf 10 40 Td [(an) -500 (old)] TJ ET", helvetica}, options,
                          DrawmereNS::SVGConfig::SVGTYPE_TINY);
     EXPECT_EQ(page.texts(), std::vector<std::string>{"anold"});
+}
+
+// Where viewers leave out a blank, they leave out its position, and the text behind it moves.
+TEST(TextWriter, NoBlankLeadsATextAndNoneFollowsAnother) {
+    const std::string shown = "(   lead) Tj 0 -20 Td (a    b) Tj 0 -20 Td (   ) Tj";
+    const DrawnPage plain = drawText(shown, TEXTMODE_PLAIN);
+    EXPECT_EQ(plain.texts(), (std::vector<std::string>{"lead", "a b"}));
+    EXPECT_THAT(plain.svg, HasSubstr("<text x=\"26.68 31.12 42.24 53.36\" y=\"60\">"));
+    EXPECT_THAT(plain.svg, HasSubstr("<text x=\"10 21.12 43.36\" y=\"80\">"));
+    const DrawnPage fonts = drawText(shown, TEXTMODE_FONTS);
+    EXPECT_EQ(fonts.texts(), (std::vector<std::string>{"lead", "a b"}));
+    EXPECT_THAT(fonts.svg, HasSubstr("<text x=\"26.68\" y=\"60\">"));
+    EXPECT_THAT(fonts.svg, HasSubstr("<text x=\"10 21.12 43.36\" y=\"80\">"));
+    EXPECT_TRUE(drawText("3 Tr (  ) Tj", TEXTMODE_FONTS).texts().empty());
+}
+
+TEST(TextWriter, GapsBecomeBlanksOnlyWhereOneIsEnough) {
+    const auto draw = [](const std::string& parts) {
+        return drawText("[" + parts + "] TJ", TEXTMODE_FONTS).texts().at(0);
+    };
+    EXPECT_EQ(draw("(an) -500 (old) -1000 (one)"), "anoldone");
+    EXPECT_EQ(draw("(an) -500 (old ) -500 (one)"), "anold one");
+    EXPECT_EQ(draw("(an) -500 (old) -500 ( one)"), "anold one");
 }
 
 /// Draws a text in which the glyph of A stands for the letters fi.
@@ -234,6 +257,29 @@ TEST(TextWriter, ALigatureOfLettersThatWereNotOneIsInAFontOfItsOwn) {
     const DrawnPage page = drawLigature("(fia) Tj (A) Tj");
     EXPECT_EQ(page.texts(), (std::vector<std::string>{"fia", "fi"}));
     EXPECT_EQ(page.count("font"), 2);
+}
+
+TEST(TextWriter, ABlankThatShowsOrIsPartOfAGlyphIsNeverLeftOut) {
+    ConvertOptions options;
+    options.textMode = TEXTMODE_FONTS;
+    const std::string font =
+        "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica/ToUnicode 5 0 R>>>>";
+    const std::string map = "1 begincodespacerange <00> <ff> endcodespacerange\n"
+                            "2 beginbfchar <41> <0020> <42> <00200066> endbfchar\n";
+    const DrawnPage page({"BT /F 20 Tf 10 40 Td (AA) Tj 0 -20 Td (B) Tj ET", font, {{"", map}}},
+                         options);
+    EXPECT_EQ(page.texts(), (std::vector<std::string>{"\u00A0\u00A0", "\u00A0f"}));
+}
+
+TEST(TextWriter, ACharacterBeyondTheFirstPlaneHasOnePosition) {
+    ConvertOptions options;
+    options.textMode = TEXTMODE_PLAIN;
+    const std::string font =
+        "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica/ToUnicode 5 0 R>>>>";
+    const std::string map = "1 begincodespacerange <00> <ff> endcodespacerange\n"
+                            "2 beginbfchar <41> <D835DC00> <42> <0042> endbfchar\n";
+    const DrawnPage page({"BT /F 20 Tf 10 40 Td (ABA) Tj ET", font, {{"", map}}}, options);
+    EXPECT_EQ(findText(page), "<text x=\"10 23.34 36.68\" y=\"60\">");
 }
 
 TEST(TextWriter, PlainTextNamesFamiliesAndPlacesEachCharacter) {

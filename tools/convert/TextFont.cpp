@@ -201,9 +201,14 @@ std::optional<int> TextFont::findBlank(int variant) {
 }
 
 bool TextFont::showsNothing(int glyph) {
-    const FT_Face face = faceOf(ctx, font);
-    return face && FT_Load_Glyph(face, static_cast<FT_UInt>(glyph), FT_LOAD_NO_SCALE) == 0 &&
-           face->glyph->format == FT_GLYPH_FORMAT_OUTLINE && face->glyph->outline.n_contours == 0;
+    std::optional<bool>& answer = findGlyph(glyph).showsNothing;
+    if (!answer) {
+        const FT_Face face = faceOf(ctx, font);
+        answer = face && FT_Load_Glyph(face, static_cast<FT_UInt>(glyph), FT_LOAD_NO_SCALE) == 0 &&
+                 face->glyph->format == FT_GLYPH_FORMAT_OUTLINE &&
+                 face->glyph->outline.n_contours == 0;
+    }
+    return *answer;
 }
 
 bool TextFont::isFilledAlike(int glyph) {

@@ -45,6 +45,9 @@ public:
     /// Returns: a glyph that a blank can stand for in a variant, or nothing.
     std::optional<int> findBlank(int variant);
 
+    /// Returns: whether a glyph has an outline and that is empty.
+    bool showsNothing(int glyph);
+
     /// Returns: whether the outline of a glyph looks alike by both rules of filling.
     bool isFilledAlike(int glyph);
 
@@ -73,13 +76,13 @@ private:
     struct Glyph {
         float advance = -1; // as a part of the em, below 0 when not read yet
         std::optional<bool> isFilledAlike;
+        std::optional<bool> showsNothing;
     };
 
     void readNames();
     std::unique_ptr<FS_ExtraFonts> loadFile(const UnicodeString& name) const;
     UnicodeString makeName(int variant) const;
     static bool take(Variant& variant, const std::u16string& text, int glyph);
-    bool showsNothing(int glyph);
     Glyph& findGlyph(int glyph);
 
     fz_context* ctx;

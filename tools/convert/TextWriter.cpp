@@ -12,6 +12,7 @@ constexpr std::size_t maxLine = 2000;
 constexpr int firstPrivate = 0xE000;
 constexpr int privateCount = 0x1900;
 constexpr int unknownCharacter = 0xFFFD;
+constexpr char16_t noBreak = 0xA0; // a blank that viewers never leave out
 
 float round(float value, float steps) { return std::rint(value * steps) / steps; }
 
@@ -41,6 +42,14 @@ void append(std::u16string& text, int character) {
     } else {
         text += static_cast<char16_t>(character);
     }
+}
+
+bool isBlank(const TextSpan::Cluster& cluster) { return cluster.text == u" "; }
+
+/// Returns: how many positions a viewer takes for the text, one for each character.
+std::size_t countCharacters(const std::u16string& text) {
+    const auto isSecondHalf = [](char16_t unit) { return unit >= 0xDC00 && unit < 0xE000; };
+    return text.size() - static_cast<std::size_t>(std::ranges::count_if(text, isSecondHalf));
 }
 
 /// A glyph without a character of its own gets one that no text means.
@@ -98,12 +107,15 @@ void TextSpan::read(const fz_text_span& span, const fz_matrix& matrix, const fz_
         const fz_text_item& item = span.items[i];
         if (item.gid < 0) {
             if (!clusters.empty() && isShown(item.ucs)) {
-                append(clusters.back().text, item.ucs);
+                std::u16string& text = clusters.back().text;
+                std::ranges::replace(text, u' ', noBreak);
+                append(text, item.ucs == ' ' ? noBreak : item.ucs);
             }
             continue;
         }
         Cluster& cluster = clusters.emplace_back();
-        appendGlyph(cluster.text, item.ucs, item.gid);
+        const bool isInk = item.ucs == ' ' && !font.showsNothing(item.gid);
+        appendGlyph(cluster.text, isInk ? noBreak : item.ucs, item.gid);
         cluster.glyph = item.gid;
         cluster.at = fz_transform_point(fz_transform_point_xy(item.x, item.y, matrix), back);
         cluster.advance = font.getAdvance(item.gid) * size;
@@ -148,12 +160,18 @@ void TextWriter::write(const TextSpan& span, const TextPaint& paint) {
         canvas.transform(span.turn);
     }
     for (const TextSpan::Cluster& cluster : span.clusters) {
+        if (isLeftOut(cluster)) {
+            continue;
+        }
         const int variant = mode == TEXTMODE_FONTS
                                 ? span.font.findVariant(cluster.text, cluster.glyph, line.variant)
                                 : 0;
         const bool isNext = follows(cluster, variant, span.font);
         if (!isNext && startsLine(cluster, variant)) {
             flushLine(span, paint);
+            if (isBlank(cluster)) {
+                continue;
+            }
             line.variant = variant;
             line.y = toHundredth(cluster.at.y);
         }
@@ -163,6 +181,13 @@ void TextWriter::write(const TextSpan& span, const TextPaint& paint) {
     if (span.isTurned) {
         canvas.pop();
     }
+}
+
+/// Returns: whether the cluster is a blank that some viewers leave out, and with it a position of
+/// the list: the first of a text, and one after another. They show nothing; what comes behind them
+/// has a position.
+bool TextWriter::isLeftOut(const TextSpan::Cluster& cluster) const {
+    return isBlank(cluster) && (line.clusters.empty() || isBlank(*line.clusters.back()));
 }
 
 /// Returns: whether the cluster is where it belongs without a position of its own. In a font of the
@@ -184,7 +209,7 @@ bool TextWriter::startsLine(const TextSpan::Cluster& cluster, int variant) const
 
 void TextWriter::add(const TextSpan::Cluster& cluster, bool isNext, TextFont& font) {
     const bool embeds = mode == TEXTMODE_FONTS;
-    const std::size_t count = cluster.text.size();
+    const std::size_t count = countCharacters(cluster.text);
     const float x = shorten(cluster.at.x);
     // In a font of the viewer the characters of a ligature share its room.
     const float step = cluster.advance / static_cast<float>(count);
@@ -195,16 +220,17 @@ void TextWriter::add(const TextSpan::Cluster& cluster, bool isNext, TextFont& fo
         line.placed = embeds ? line.x.size() - count + 1 : line.x.size();
     }
     line.next = (isNext ? line.next : x) + cluster.advance;
-    line.hasLigature = line.hasLigature || (embeds && count > 1);
+    line.hasLigature = line.hasLigature || (embeds && cluster.text.size() > 1);
     line.hasRightToLeft = line.hasRightToLeft || cluster.isRightToLeft;
     line.isFilledAlike = line.isFilledAlike && (!embeds || font.isFilledAlike(cluster.glyph));
     line.clusters.push_back(&cluster);
-    line.text.append(cluster.text.data(), static_cast<std::int32_t>(count));
-    line.glyphs.push_back(
-        {static_cast<std::int16_t>(count), static_cast<std::uint16_t>(cluster.glyph)});
+    line.text.append(cluster.text.data(), static_cast<std::int32_t>(cluster.text.size()));
+    line.glyphs.push_back({static_cast<std::int16_t>(cluster.text.size()),
+                           static_cast<std::uint16_t>(cluster.glyph)});
 }
 
-/// Puts blanks into a line where words are that far apart, when it needs no further position then.
+/// Puts a blank into a line wherever words are that far apart, when it needs no further position
+/// then.
 void TextWriter::fillGaps(const TextSpan& span) {
     const std::optional<int> blank = span.font.findBlank(line.variant);
     std::optional<Gaps> gaps = blank ? measureGaps(span) : std::nullopt;
@@ -239,7 +265,6 @@ void TextWriter::fillGaps(const TextSpan& span) {
 /// Returns: how many blanks of what width stand between the glyphs, or nothing.
 std::optional<TextWriter::Gaps> TextWriter::measureGaps(const TextSpan& span) const {
     constexpr float minGap = 0.15F; // of the size of the font
-    constexpr int maxBlanks = 40;
     std::vector<float> widths(line.clusters.size());
     float least = 0;
     float sum = 0;
@@ -247,6 +272,9 @@ std::optional<TextWriter::Gaps> TextWriter::measureGaps(const TextSpan& span) co
         const TextSpan::Cluster& before = *line.clusters[i - 1];
         const float gap = line.clusters[i]->at.x - before.at.x - before.advance;
         if (gap > minGap * span.size) {
+            if (isBlank(before) || isBlank(*line.clusters[i])) {
+                return std::nullopt;
+            }
             widths[i] = gap;
             least = least > 0 ? std::min(least, gap) : gap;
             sum += gap;
@@ -261,7 +289,7 @@ std::optional<TextWriter::Gaps> TextWriter::measureGaps(const TextSpan& span) co
     for (const float width : widths) {
         gaps.blanks.push_back(least > 0 ? static_cast<int>(std::lround(width / least)) : 0);
         count += gaps.blanks.back();
-        if (gaps.blanks.back() > maxBlanks) {
+        if (gaps.blanks.back() > 1) {
             return std::nullopt;
         }
     }

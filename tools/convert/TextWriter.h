@@ -86,6 +86,7 @@ private:
         float width = 0;         // of a blank
     };
 
+    bool isLeftOut(const TextSpan::Cluster& cluster) const;
     bool follows(const TextSpan::Cluster& cluster, int variant, TextFont& font) const;
     bool startsLine(const TextSpan::Cluster& cluster, int variant) const;
     void add(const TextSpan::Cluster& cluster, bool isNext, TextFont& font);
