@@ -282,6 +282,24 @@ TEST(TextWriter, ACharacterBeyondTheFirstPlaneHasOnePosition) {
     EXPECT_EQ(findText(page), "<text x=\"10 23.34 36.68\" y=\"60\">");
 }
 
+// Widths that are not those of the font that stands in for it stretch its glyphs.
+TEST(TextWriter, StrokedTextThatCannotBeWrittenIsStrokedAsOutlines) {
+    std::string widths;
+    for (int i = 0; i < 95; ++i) {
+        widths += "350 ";
+    }
+    const std::string font =
+        "/Font<</F<</Type/Font/Subtype/TrueType/BaseFont/Nobodys/Encoding/WinAnsiEncoding"
+        "/FirstChar 32/LastChar 126/Widths[" +
+        widths + "]/FontDescriptor<</Type/FontDescriptor/FontName/Nobodys/Flags 32/StemV 80>>>>>>";
+    ConvertOptions options;
+    options.textMode = TEXTMODE_FONTS;
+    const DrawnPage page({"BT /F 20 Tf 1 Tr 1 0 0 RG 10 40 Td (Hollow) Tj ET", font}, options);
+    EXPECT_EQ(page.report.countApproximations(), 1);
+    EXPECT_EQ(page.attribute("path", "stroke"), "red");
+    EXPECT_EQ(page.attribute("path", "fill"), "none");
+}
+
 TEST(TextWriter, PlainTextNamesFamiliesAndPlacesEachCharacter) {
     const DrawnPage page = drawText("(Hello) Tj", TEXTMODE_PLAIN);
     EXPECT_EQ(page.texts(), std::vector<std::string>{"Hello"});

@@ -30,15 +30,11 @@ void readRun(GridFont& grid, const fz_text_span& span, const fz_matrix& matrix, 
     });
 }
 
-void readRuns(GlyphOutlines& outlines, const fz_text& text, const fz_matrix& matrix,
-              PathData& path) {
-    std::vector<DrawnGlyph> drawn;
-    for (const fz_text_span* span = text.head; span; span = span->next) {
-        GlyphRun run;
-        GridFont& grid = outlines.findGrid(span->font, fz_concat(span->trm, matrix));
-        readRun(grid, *span, matrix, run, drawn);
-        run.appendTo(path);
-    }
+void appendRun(GlyphOutlines& outlines, const fz_text_span& span, const fz_matrix& matrix,
+               PathData& path, std::vector<DrawnGlyph>& drawn) {
+    GlyphRun run;
+    readRun(outlines.findGrid(span.font, fz_concat(span.trm, matrix)), span, matrix, run, drawn);
+    run.appendTo(path);
 }
 
 void readOutlines(GlyphOutlines& outlines, const fz_text& text, const fz_matrix& matrix,

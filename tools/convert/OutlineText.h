@@ -22,9 +22,10 @@ struct DrawnGlyph {
 void readRun(GridFont& grid, const fz_text_span& span, const fz_matrix& matrix, GlyphRun& run,
              std::vector<DrawnGlyph>& drawn);
 
-/// Appends the outlines of all glyphs of `text` to `path`, as runs have them.
-void readRuns(GlyphOutlines& outlines, const fz_text& text, const fz_matrix& matrix,
-              PathData& path);
+/// Appends the outlines of all glyphs of `span` to `path`, as a run has them, and to `drawn` the
+/// glyphs without one.
+void appendRun(GlyphOutlines& outlines, const fz_text_span& span, const fz_matrix& matrix,
+               PathData& path, std::vector<DrawnGlyph>& drawn);
 
 /// Appends the outlines of all glyphs of `text` to `path`, as exact as a path can be.
 void readOutlines(GlyphOutlines& outlines, const fz_text& text, const fz_matrix& matrix,

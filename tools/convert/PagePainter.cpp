@@ -201,12 +201,16 @@ void PagePainter::strokeText(const fz_text& text, const fz_stroke_state& style,
                              const fz_matrix& matrix, const Paint& paint) {
     const StrokeMatrices matrices = startStroke(matrix);
     // A pen that becomes an ellipse is for outlines alone.
-    if (options.textMode != TEXTMODE_OUTLINES && matrices.isPlain) {
-        writeText(text, matrix, {PAINTMODE_STROKE, {}, paint, toPen(style, matrices.penScale)});
-        return;
+    const bool isWritten = options.textMode != TEXTMODE_OUTLINES && matrices.isPlain;
+    const TextPaint pen = {PAINTMODE_STROKE, {}, paint, toPen(style, matrices.penScale)};
+    std::vector<DrawnGlyph> drawn;
+    for (const fz_text_span* span = text.head; span; span = span->next) {
+        if (!isWritten || !writeSpan(*span, matrix, pen)) {
+            appendRun(outlines, *span, matrices.points, current, drawn); // as what is filled
+        }
     }
-    readRuns(outlines, text, matrices.points, current); // to be equal to what is filled
     stroke(style, matrices, paint);
+    drawGlyphs(drawn, matrix, paint); // which have nothing for a pen
 }
 
 void PagePainter::clipText(const fz_text& text, const fz_matrix& matrix) {
