@@ -76,6 +76,30 @@ TEST_F(ProgramRun, ASingleFileHoldsAllPagesBelowEachOther) {
     EXPECT_THAT(svg, HasSubstr("width=\"200pt\" height=\"1332pt\"")); // 12 pages, 11 gaps
 }
 
+TEST_F(ProgramRun, PagesAreTurnedAndCutAsTheDocumentSays) {
+    const std::string box = "20 20 30 10 re f";
+    conversion.directory.write("a.pdf", TinyPdf()
+                                            .addPage(box, "/CropBox[10 10 150 90]")
+                                            .addPage(box, "/CropBox[10 10 150 90]/Rotate 90")
+                                            .addPage(box, "/UserUnit 2/MediaBox[0 0 50 40]")
+                                            .write());
+    run({"-o", "out/"});
+    const auto expectPage = [&](const std::string& file, const std::string& text) {
+        EXPECT_THAT(conversion.directory.read(file), HasSubstr(text));
+    };
+    expectPage("out/a1.svg", "width=\"140pt\" height=\"80pt\" viewBox=\"0 0 140 80\"");
+    expectPage("out/a1.svg", "<rect x=\"10\" y=\"60\" width=\"30\" height=\"10\"");
+    expectPage("out/a2.svg", "width=\"80pt\" height=\"140pt\" viewBox=\"0 0 80 140\"");
+    expectPage("out/a2.svg", "<rect x=\"10\" y=\"10\" width=\"10\" height=\"30\"");
+    expectPage("out/a3.svg", "width=\"100pt\" height=\"80pt\" viewBox=\"0 0 100 80\"");
+    expectPage("out/a3.svg", "<rect x=\"40\" y=\"20\" width=\"60\" height=\"20\"");
+    // One below the other, twelve points apart, on a sheet as wide as the widest.
+    run({"--single-file", "-o", "all.svg"});
+    expectPage("all.svg", "width=\"140pt\" height=\"324pt\"");
+    expectPage("all.svg", "<rect x=\"10\" y=\"102\" width=\"10\" height=\"30\"");
+    expectPage("all.svg", "<rect x=\"40\" y=\"264\" width=\"60\" height=\"20\"");
+}
+
 TEST_F(ProgramRun, TheStandardOutputTakesTheSameDocument) {
     run({"--single-file", "-o", "all.svg"});
     const CommandResult result = conversion.runShell("$convert a.pdf -o - 2>/dev/null");
