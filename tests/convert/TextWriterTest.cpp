@@ -282,6 +282,35 @@ TEST(TextWriter, ACharacterBeyondTheFirstPlaneHasOnePosition) {
     EXPECT_EQ(findText(page), "<text x=\"10 23.34 36.68\" y=\"60\">");
 }
 
+/// Draws a text in which nothing is known of the glyph of A, and that of B is a soft hyphen.
+DrawnPage drawUnknown(const std::string& shown, TEXTMODE mode) {
+    ConvertOptions options;
+    options.textMode = mode;
+    const std::string font =
+        "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica/ToUnicode 5 0 R>>>>";
+    const std::string map = "1 begincodespacerange <00> <ff> endcodespacerange\n"
+                            "4 beginbfchar <41> <FFFD> <42> <00AD> <43> <0043> "
+                            "<44> <00680065006C006C006F> endbfchar\n";
+    return DrawnPage({"BT /F 20 Tf 10 40 Td " + shown + " ET", font, {{"", map}}}, options);
+}
+
+TEST(TextWriter, GlyphsWithoutCharactersAreOutlinesUnlessTheirFontIsThere) {
+    const DrawnPage plain = drawUnknown("(CA) Tj", TEXTMODE_PLAIN);
+    EXPECT_EQ(plain.count("path"), 1);
+    EXPECT_THAT(plain.texts().at(0), testing::StartsWith("C")); // to be searched for
+    EXPECT_THAT(plain.body(), HasSubstr("fill=\"none\""));
+    EXPECT_EQ(plain.report.countApproximations(), 1);
+    EXPECT_EQ(drawUnknown("(CA) Tj", TEXTMODE_FONTS).count("path"), 0);
+    EXPECT_EQ(drawUnknown("(D) Tj", TEXTMODE_PLAIN).count("path"), 1); // that of a whole word
+    EXPECT_EQ(drawUnknown("3 Tr (CA) Tj", TEXTMODE_PLAIN).count("path"), 0);
+}
+
+TEST(TextWriter, AHyphenThatViewersHideIsOneThatTheyShow) {
+    for (const TEXTMODE mode : {TEXTMODE_PLAIN, TEXTMODE_FONTS}) {
+        EXPECT_EQ(drawUnknown("(CB) Tj", mode).texts(), std::vector<std::string>{"C\u2010"});
+    }
+}
+
 // Widths that are not those of the font that stands in for it stretch its glyphs.
 TEST(TextWriter, StrokedTextThatCannotBeWrittenIsStrokedAsOutlines) {
     std::string widths;

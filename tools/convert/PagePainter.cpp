@@ -156,10 +156,16 @@ bool PagePainter::writeSpan(const fz_text_span& span, const fz_matrix& matrix,
         return false;
     }
     const TextSpan text(span, layers.place(matrix), font);
-    if (!text.isEmpty() && layers.enter(text.getBounds())) {
-        writeEntered(text, paint);
+    // For what has no character the viewer's font would show something else. It stays text unseen.
+    const bool isDrawn = options.textMode == TEXTMODE_PLAIN && paint.mode != PAINTMODE_NONE &&
+                         text.hasUnknown && !text.isEmpty();
+    if (isDrawn) {
+        report.note(APPROXIMATION_TEXT);
     }
-    return true;
+    if (!text.isEmpty() && layers.enter(text.getBounds())) {
+        writeEntered(text, isDrawn ? TextPaint{PAINTMODE_NONE} : paint);
+    }
+    return !isDrawn;
 }
 
 void PagePainter::writeEntered(const TextSpan& text, const TextPaint& paint) {

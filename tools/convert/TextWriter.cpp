@@ -9,6 +9,7 @@ namespace {
 
 constexpr float closeEnough = 0.009F; // points
 constexpr std::size_t maxLine = 2000;
+constexpr std::size_t maxLigature = 4; // a glyph of more characters is no picture of them
 constexpr int firstPrivate = 0xE000;
 constexpr int privateCount = 0x1900;
 constexpr int unknownCharacter = 0xFFFD;
@@ -42,6 +43,14 @@ void append(std::u16string& text, int character) {
     } else {
         text += static_cast<char16_t>(character);
     }
+}
+
+/// Returns: the character that viewers show as documents show this one. They hide soft hyphens,
+/// which many documents have for those at the ends of lines.
+int toShown(int character) {
+    constexpr int softHyphen = 0xAD;
+    constexpr int hyphen = 0x2010;
+    return character == softHyphen ? hyphen : character;
 }
 
 bool isBlank(const TextSpan::Cluster& cluster) { return cluster.text == u" "; }
@@ -110,12 +119,16 @@ void TextSpan::read(const fz_text_span& span, const fz_matrix& matrix, const fz_
                 std::u16string& text = clusters.back().text;
                 std::ranges::replace(text, u' ', noBreak);
                 append(text, item.ucs == ' ' ? noBreak : item.ucs);
+                hasUnknown = hasUnknown || text.size() > maxLigature;
             }
             continue;
         }
         Cluster& cluster = clusters.emplace_back();
-        const bool isInk = item.ucs == ' ' && !font.showsNothing(item.gid);
-        appendGlyph(cluster.text, isInk ? noBreak : item.ucs, item.gid);
+        const int character = toShown(item.ucs);
+        const bool isInk =
+            (character == ' ' || !isShown(character)) && !font.showsNothing(item.gid);
+        hasUnknown = hasUnknown || (isInk && character != ' ');
+        appendGlyph(cluster.text, isInk && character == ' ' ? noBreak : character, item.gid);
         cluster.glyph = item.gid;
         cluster.at = fz_transform_point(fz_transform_point_xy(item.x, item.y, matrix), back);
         cluster.advance = font.getAdvance(item.gid) * size;

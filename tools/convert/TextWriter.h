@@ -48,6 +48,7 @@ public:
     float size = 0;               ///< of the font, in points
     fz_matrix turn = fz_identity; ///< does not change sizes
     bool isTurned = false;
+    bool hasUnknown = false; ///< glyphs that show something else than their characters would
     std::vector<Cluster> clusters;
 
 private:
