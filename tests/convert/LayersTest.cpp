@@ -176,6 +176,12 @@ TEST(Layers, BlendModesInAPatternAreCounted) {
     EXPECT_EQ(page.count("image"), 0);
 }
 
+TEST(Layers, OverprintIsCountedOnceAPage) {
+    const DrawnPage page({"/O gs 9 9 9 9 re f 29 9 9 9 re f", "/ExtGState<</O<</OP true>>>>"});
+    EXPECT_EQ(page.report.approximations.at(DrawmereConvert::APPROXIMATION_OVERPRINT), 1);
+    EXPECT_EQ(page.report.countApproximations(), 1);
+}
+
 TEST(Layers, TextClipsWhatComesAfterIt) {
     const DrawnPage page(Conversion::document("TextClippingModeChanges.pdf"), 0);
     EXPECT_GT(page.count("clipPath"), 0);
