@@ -55,6 +55,7 @@ const Misuse misuses[] = {
     {{"a.pdf", "--jobs", "0"}, "--jobs"},
     {{"a.pdf", "--timeout", "-1"}, "--timeout"},
     {{"a.pdf", "--timeout", "nan"}, "--timeout"},
+    {{"a.pdf", "--precision", "nan"}, "--precision"},
     {{"a.pdf", "--number-format", "../1"}, "--number-format"},
     {{"a.pdf", "a.pdf"}, "a.pdf is given twice"},
     {{"a.pdf", "--max-size", "5"}, "--max-size"},

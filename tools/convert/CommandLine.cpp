@@ -168,9 +168,13 @@ private:
         settlePlace();
     }
 
+    // What is no number at all lies within every range.
     void settleNumbers() {
-        if (!std::isfinite(options.timeout)) {
+        if (std::isnan(options.timeout)) {
             throw CLI::ValidationError("--timeout", "that is no number of seconds");
+        }
+        if (std::isnan(options.convert.precision)) {
+            throw CLI::ValidationError("--precision", "that is no number of points");
         }
         if (options.numberFormat.find('/') != std::string::npos) {
             throw CLI::ValidationError("--number-format", "a slash can't be part of a name");
