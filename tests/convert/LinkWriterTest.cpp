@@ -69,7 +69,9 @@ TEST_F(LinkWriter, InASingleFileLinksStayInside) {
 }
 
 TEST_F(LinkWriter, ALinkToAPageThatIsNotConvertedIsNone) {
-    convert({"-o", "out/p.svg", "--pages", "1,3"});
+    const CommandResult result = conversion.run(
+        {Conversion::document("pdflatex-outline.pdf"), "-o", "out/p.svg", "--pages", "1,3"});
+    EXPECT_THAT(result.output, HasSubstr(" left out"));
     const std::string page = conversion.directory.read("out/p1.svg");
     EXPECT_THAT(page, HasSubstr("p3.svg#"));
     EXPECT_THAT(page, Not(HasSubstr("p2.svg#")));
@@ -88,7 +90,9 @@ TEST_F(LinkWriter, ALinkToAScriptIsNone) {
                                          "<a href='JavaScript:alert(2)'>2</a> "
                                          "<a href='MAILTO:a@example.com'>3</a> "
                                          "<a href='tel:0123'>4</a></p></body></html>");
-    EXPECT_EQ(conversion.run({"a.html", "-o", "a.svg"}).status, 0);
+    const CommandResult result = conversion.run({"a.html", "-o", "a.svg"});
+    EXPECT_EQ(result.status, 0);
+    EXPECT_THAT(result.output, HasSubstr("; 2 links left out"));
     const std::string page = conversion.directory.read("a.svg");
     EXPECT_THAT(page, Not(HasSubstr("cript:alert")));
     EXPECT_THAT(page, HasSubstr("<a xlink:href=\"MAILTO:a@example.com\">"));

@@ -148,10 +148,7 @@ std::vector<PageLink> readLinks(fz_context* ctx, fz_document* document, fz_page*
     std::vector<PageLink> links;
     callFitz(ctx, [&] { first = fz_load_links(ctx, page); });
     for (const fz_link* link = first; link; link = link->next) {
-        PageLink read = toLink(ctx, document, *link);
-        if (!read.uri.empty() || read.page >= 0) {
-            links.push_back(std::move(read));
-        }
+        links.push_back(toLink(ctx, document, *link));
     }
     fz_drop_link(ctx, first);
     return links;

@@ -12,7 +12,8 @@
 
 namespace DrawmereConvert {
 
-/// A link of a page.
+/// A link of a page. Without a URI and a page it leads nowhere: to a place that isn't in the
+/// document, or to what `leadsToPlace` turns away.
 struct PageLink {
     fz_rect area{};              ///< where it can be clicked, in the coordinates of the page
     std::string uri;             ///< UTF-8, of a link that leads out of the document
@@ -24,7 +25,7 @@ struct PageLink {
 /// is none; a browser that shows the page would run it.
 bool leadsToPlace(std::string_view uri);
 
-/// Returns: the links of `page` that lead somewhere; none when they can't be read.
+/// Returns: the links of `page`; none when they can't be read.
 std::vector<PageLink> readLinks(fz_context* ctx, fz_document* document, fz_page* page);
 
 /// Returns: the outline; none when it can't be read.

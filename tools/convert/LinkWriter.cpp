@@ -78,7 +78,11 @@ void LinkWriter::writeLinks(const std::vector<PageLink>& links, PageReport& repo
     for (const PageLink& link : links) {
         const UnicodeString target = findTarget(link);
         const fz_rect area = fz_translate_rect(link.area, shift.x, shift.y);
-        if (target.isEmpty() || fz_is_empty_rect(area)) {
+        if (fz_is_empty_rect(area)) {
+            continue;
+        }
+        if (target.isEmpty()) {
+            report.note(APPROXIMATION_LINK);
             continue;
         }
         canvas.beginLink(target, /*isNewWindow=*/false);

@@ -24,6 +24,7 @@ constexpr std::array<ApproximationWords, APPROXIMATION_COUNT> approximationWords
     {"text drawn as outlines", "texts drawn as outlines"},
     {"clip or group too deep", "clips or groups too deep"},
     {"clip left out or widened", "clips left out or widened"},
+    {"link left out", "links left out"},
     {"thing too large for some viewers", "things too large for some viewers"},
 }};
 

@@ -23,6 +23,7 @@ enum APPROXIMATION : std::int32_t {
     APPROXIMATION_TEXT,      ///< text drawn as outlines though the mode asks for text
     APPROXIMATION_DEPTH,     ///< a clip or group left out where elements nest too deep
     APPROXIMATION_CLIP,      ///< something not cut, or cut straight, as the profile knows no more
+    APPROXIMATION_LINK,      ///< a link left out, as there is nothing for it to lead to
     APPROXIMATION_LIMIT,     ///< written all the same, though some viewers refuse so much
     APPROXIMATION_COUNT,
 };
