@@ -37,6 +37,10 @@ struct Bomb : testing::Test {
 
     Bomb() { conversion->runShell("rm -rf out"); }
 
+#if defined(__SANITIZE_ADDRESS__)
+    void SetUp() override { GTEST_SKIP() << "the sanitizer needs the address space for itself"; }
+#endif
+
     /// Converts with little memory and time.
     static CommandResult run(const std::string& inputs,
                              const std::string& options = "--timeout .4 -o out/") {
