@@ -65,17 +65,20 @@ set_target_properties(drawmere PROPERTIES
     SOVERSION ${PROJECT_VERSION_MAJOR}
 )
 # Calls inside the library stay inside: nobody puts functions of theirs in the place of ours.
-target_compile_options(mox PRIVATE $<$<NOT:$<CONFIG:Debug>>:-fno-semantic-interposition>)
-target_compile_options(drawmere_objects PRIVATE $<$<NOT:$<CONFIG:Debug>>:-fno-semantic-interposition>)
+foreach(target IN ITEMS mox drawmere_objects)
+    target_compile_options(${target} PRIVATE
+        $<$<NOT:$<CONFIG:Debug>>:-fno-semantic-interposition>
+    )
+endforeach()
 target_link_options(drawmere PRIVATE -Wl,-Bsymbolic-functions)
 target_link_libraries(mox PUBLIC drawmere_flags drawmere_depends)
 target_link_libraries(drawmere_objects PUBLIC drawmere_flags drawmere_depends)
 target_link_libraries(drawmere PUBLIC ICU::uc PRIVATE drawmere_flags drawmere_depends)
 
-# What most sources of the library include of other people's headers. Reading them takes most of the time of
-# compiling a source, so they are read once for all of them. Nothing of ours is among them, so that
-# this is not done again with every change. The presets `tidy` and `release` do without, and so see
-# that each source includes what it needs.
+# What most sources of the library include of other people's headers. Reading them takes most of
+# the time of compiling a source, so they are read once for all of them. Nothing of ours is among
+# them, so that this is not done again with every change. The presets `tidy` and `release` do
+# without, and so see that each source includes what it needs.
 set(DRAWMERE_COMMON_HEADERS
     <algorithm>
     <array>
@@ -95,9 +98,9 @@ set(DRAWMERE_COMMON_HEADERS
     <utility>
     <vector>
 )
-# The first lets ccache tell such sources apart. In them GCC 12 may also see strings overlap that are
-# added up, and they never do. The converter adds up many strings, for which it sees more that is not
-# there, and does without.
+# The first option lets ccache tell such sources apart. In them GCC 12 may also see strings overlap
+# that are added up, and they never do. The converter adds up many strings, for which it sees more
+# that is not there, and does without.
 add_library(drawmere_precompiled INTERFACE)
 target_compile_options(drawmere_precompiled INTERFACE
     $<$<CXX_COMPILER_ID:GNU>:-fpch-preprocess>
