@@ -9,11 +9,11 @@ constexpr std::string_view urlStart = "url(#";
 
 } // namespace
 
-References::References(const XmlReading& reading) {
+References::References(const XmlReading& reading, bool isSmallDevice) {
     int definitions = 0; // how many are open
     for (const XmlEvent& event : reading.events) {
         if (event.kind == XmlEvent::START) {
-            readElement(event, definitions > 0);
+            readElement(event, isSmallDevice && definitions > 0);
         }
         if (event.name == "defs") {
             definitions += event.kind == XmlEvent::START ? 1 : -1;
@@ -21,10 +21,9 @@ References::References(const XmlReading& reading) {
     }
 }
 
-void References::readElement(const XmlEvent& event, bool isInDefinitions) {
-    // An image lies in a file, whose name may begin in any way. What a definition uses for itself
-    // is never shown.
-    const bool isOutside = event.name == "image" || (event.name == "use" && isInDefinitions);
+void References::readElement(const XmlEvent& event, bool isLeftAlone) {
+    // An image lies in a file, whose name may begin in any way.
+    const bool isOutside = event.name == "image" || (event.name == "use" && isLeftAlone);
     for (const auto& [name, value] : event.attributes) {
         if (name == "id") {
             ids.insert(value);

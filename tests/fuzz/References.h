@@ -15,7 +15,9 @@ using icu::UnicodeString;
 /// The ids of a document, and the references to ids within it.
 class References {
 public:
-    explicit References(const XmlReading& reading);
+    /// Small-device mode turns what is drawn into the data of its image and leaves definitions
+    /// alone, so that what a definition uses need not be there.
+    References(const XmlReading& reading, bool isSmallDevice);
 
     /// Returns: the first reference that leads nowhere, empty when there is none. References in the
     /// caller's own words are the caller's business, and those to a definition that was not
@@ -25,7 +27,7 @@ public:
                           const std::vector<UnicodeString>& lost) const;
 
 private:
-    void readElement(const XmlEvent& event, bool isInDefinitions);
+    void readElement(const XmlEvent& event, bool isLeftAlone);
 
     std::set<std::string> ids;
     std::set<std::string> references; // without "#"

@@ -12,10 +12,11 @@ namespace {
 
 constexpr int callCount = 2000;
 
-void checkDocument(const std::string& document, const RandomCalls& calls) {
+void checkDocument(const std::string& document, const RandomCalls& calls, bool isSmallDevice) {
     const XmlReading reading = readXml(document);
     require(reading.error.empty(), reading.error);
-    const std::string fault = References(reading).findFault(calls.madeTexts, calls.lostIds);
+    const std::string fault =
+        References(reading, isSmallDevice).findFault(calls.madeTexts, calls.lostIds);
     require(fault.empty(), fault);
 }
 
@@ -33,8 +34,9 @@ void checkTree(const MoxDocument& document) {
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     RandomCalls calls(inputOf(data, size));
     RandomRun run(calls);
+    const bool isSmallDevice = run.config.wispMode && run.config.svgType == SVGConfig::SVGTYPE_TINY;
     for (const std::string& document : run.draw(callCount)) {
-        checkDocument(document, calls);
+        checkDocument(document, calls, isSmallDevice);
     }
     for (const auto& [page, document] : run.drawmere.documents) {
         checkTree(*document);
