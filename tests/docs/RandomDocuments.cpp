@@ -3,6 +3,8 @@
 // Usage: docs_random_documents DIRECTORY
 #include "tests/support/RandomRun.h"
 
+#include <cstdio>
+
 using namespace DrawmereTest;
 
 namespace {
@@ -28,17 +30,23 @@ void write(const Profile& profile, unsigned seed, const std::string& directory) 
     run.config.wispMode = false;
     int number = 0;
     for (const std::string& document : run.draw(callCount)) {
-        const std::string name = std::to_string(seed) + "-" + std::to_string(++number);
-        std::ofstream(directory + "/" + profile.letter + name + ".svg") << document;
+        std::ostringstream path;
+        path << directory << '/' << profile.letter << seed << '-' << ++number << ".svg";
+        std::ofstream(path.str()) << document;
     }
 }
 
 } // namespace
 
 int main(int argc, char** argv) {
-    for (const Profile& profile : profiles) {
-        for (unsigned seed = 0; argc == 2 && seed < seedCount; ++seed) {
-            write(profile, seed, argv[1]);
+    try {
+        for (const Profile& profile : profiles) {
+            for (unsigned seed = 0; argc == 2 && seed < seedCount; ++seed) {
+                write(profile, seed, argv[1]);
+            }
         }
+    } catch (const std::exception& error) {
+        std::fprintf(stderr, "docs_random_documents: %s\n", error.what());
+        return 1;
     }
 }
