@@ -5,12 +5,9 @@
 #include "tools/convert/Canvas.h"
 #include "tools/convert/ConvertOptions.h"
 #include "tools/convert/PageReport.h"
-#include "tools/convert/TextFont.h"
-
-#include <mupdf/fitz.h>
+#include "tools/convert/TextSpan.h"
 
 #include <optional>
-#include <string>
 #include <vector>
 
 namespace DrawmereConvert {
@@ -21,39 +18,6 @@ struct TextPaint {
     Paint fill{};
     Paint stroke{};
     Pen pen{};
-};
-
-/// A span of text in one font, ready to be written.
-class TextSpan {
-public:
-    /// Shape: `matrix`, of the text.
-    TextSpan(const fz_text_span& span, const fz_matrix& matrix, TextFont& textFont);
-
-    bool isEmpty() const { return clusters.empty() || !(size > 0); }
-
-    /// Returns: where the text is, roughly, in the coordinates of the document.
-    fz_rect getBounds() const;
-
-    /// Glyphs, each with the characters it stands for. Shape: points in the coordinates of the
-    /// text, which `turn` leads to those of the document.
-    struct Cluster {
-        std::u16string text;
-        int glyph = 0;
-        fz_point at{};
-        float advance = 0; ///< in points
-        bool isRightToLeft = false;
-    };
-
-    TextFont& font;
-    float size = 0;               ///< of the font, in points
-    fz_matrix turn = fz_identity; ///< does not change sizes
-    bool isTurned = false;
-    bool hasUnknown = false; ///< glyphs that show something else than their characters would
-    std::vector<Cluster> clusters;
-
-private:
-    void read(const fz_text_span& span, const fz_matrix& matrix, const fz_matrix& back);
-    void orderRightToLeft();
 };
 
 /// Writes spans as text elements, as few as put every glyph where it belongs.
