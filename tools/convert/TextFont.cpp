@@ -264,6 +264,15 @@ float TextFont::getAdvance(int glyph) {
     return advance;
 }
 
+std::optional<float> TextFont::findStretchedWidth(int glyph) const {
+    constexpr float units = 1000.0F;
+    if (!font->flags.ft_stretch || !font->width_table) {
+        return std::nullopt;
+    }
+    const bool isListed = glyph >= 0 && glyph < font->width_count;
+    return static_cast<float>(isListed ? font->width_table[glyph] : font->width_default) / units;
+}
+
 TextFont& FontBook::find(fz_font* font) {
     std::unique_ptr<TextFont>& entry = fonts[font];
     if (!entry) {

@@ -59,6 +59,10 @@ public:
     /// Returns: the advance of a glyph in the font file, as a part of the em.
     float getAdvance(int glyph);
 
+    /// Returns: the width that a glyph of a font that stands in for another is stretched to, as a
+    /// part of the em, or nothing.
+    std::optional<float> findStretchedWidth(int glyph) const;
+
     /// Forgets which texts stand for which glyphs; to be called for each new document.
     void startDocument() { variants.clear(); }
 

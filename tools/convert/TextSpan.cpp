@@ -112,6 +112,8 @@ void TextSpan::read(const fz_text_span& span, const fz_matrix& matrix, const fz_
         cluster.glyph = item.gid;
         cluster.at = fz_transform_point(fz_transform_point_xy(item.x, item.y, matrix), back);
         cluster.advance = font.getAdvance(item.gid) * size;
+        cluster.width =
+            font.findStretchedWidth(item.gid).value_or(font.getAdvance(item.gid)) * size;
         cluster.isRightToLeft = isRightToLeft(item.ucs);
     }
 }

@@ -27,7 +27,8 @@ public:
         std::u16string text;
         int glyph = 0;
         fz_point at{};
-        float advance = 0; ///< in points
+        float advance = 0; ///< of the font file, in points
+        float width = 0;   ///< of the room it has in the document, in points
         bool isRightToLeft = false;
     };
 

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <numeric>
 
 namespace DrawmereConvert {
 namespace {
@@ -106,83 +105,75 @@ void TextWriter::add(const TextSpan::Cluster& cluster, bool isNext, TextFont& fo
                            static_cast<std::uint16_t>(cluster.glyph)});
 }
 
-/// Puts a blank into a line wherever words are that far apart, when it needs no further position
-/// then.
-void TextWriter::fillGaps(const TextSpan& span) {
-    const std::optional<int> blank = span.font.findBlank(line.variant);
-    std::optional<Gaps> gaps = blank ? measureGaps(span) : std::nullopt;
-    if (!gaps) {
+/// Puts a blank wherever words are apart without one, so that they can be searched for and copied.
+void TextWriter::separateWords(const TextSpan& span) {
+    const bool embeds = mode == TEXTMODE_FONTS;
+    const std::optional<int> blank = embeds ? span.font.findBlank(line.variant) : 0;
+    if (!blank) {
         return;
     }
-    const float advance = span.font.getAdvance(*blank) * span.size;
-    const float spacing = round(gaps->width - advance, 1000.0F);
-    gaps->width = advance + spacing;
-    const std::optional<float> start = findStart(*gaps, spacing);
-    if (!start || !isShorter(*gaps, spacing)) {
-        return;
+    const WordGaps gaps(line.clusters, span.size);
+    // The lesser profiles have no word spacing.
+    const bool canFill =
+        embeds && line.placed > 1 && !line.hasRightToLeft && canvas.getClipping() != CLIPPING_NONE;
+    if (!(canFill && fillGaps(span, gaps, *blank))) {
+        insertBlanks(gaps, *blank);
     }
-    line.wordSpacing = spacing;
-    line.x.front() = *start;
-    span.font.findVariant(u" ", *blank, line.variant);
-    Line spaced;
-    for (std::size_t i = 0; i < line.clusters.size(); ++i) {
-        for (int count = gaps->blanks[i]; count > 0; --count) {
-            spaced.text.append(u' ');
-            spaced.glyphs.push_back({1, static_cast<std::uint16_t>(*blank)});
-        }
-        const std::u16string& text = line.clusters[i]->text;
-        spaced.text.append(text.data(), static_cast<std::int32_t>(text.size()));
-        spaced.glyphs.push_back(line.glyphs[i]);
+    if (embeds && !gaps.isEmpty()) {
+        span.font.findVariant(u" ", *blank, line.variant);
     }
-    line.text = spaced.text;
-    line.glyphs = std::move(spaced.glyphs);
-    line.placed = 1;
 }
 
-/// Returns: how many blanks of what width stand between the glyphs, or nothing.
-std::optional<TextWriter::Gaps> TextWriter::measureGaps(const TextSpan& span) const {
-    constexpr float minGap = 0.15F; // of the size of the font
-    std::vector<float> widths(line.clusters.size());
-    float least = 0;
+/// Spaces words equally, when the line needs no further position then. Returns: whether it does.
+bool TextWriter::fillGaps(const TextSpan& span, const WordGaps& gaps, int blank) {
+    const float advance = span.font.getAdvance(blank) * span.size;
+    const std::optional<float> width = measureBlank(span.font, gaps, advance);
+    if (!width) {
+        return false;
+    }
+    const float spacing = round(*width - advance, 1000.0F);
+    const std::optional<float> start = findStart(gaps, advance + spacing, spacing);
+    if (!start || !isShorter(gaps, spacing)) {
+        return false;
+    }
+    insertBlanks(gaps, blank);
+    line.wordSpacing = spacing;
+    line.x.front() = *start;
+    line.placed = 1;
+    return true;
+}
+
+/// Returns: the width of a blank for all gaps, `usual` without any, or nothing when that is not
+/// all it needs.
+std::optional<float> TextWriter::measureBlank(TextFont& font, const WordGaps& gaps,
+                                              float usual) const {
     float sum = 0;
-    for (std::size_t i = 1; i < widths.size(); ++i) {
+    int count = 0;
+    for (std::size_t i = 1; i < line.clusters.size(); ++i) {
         const TextSpan::Cluster& before = *line.clusters[i - 1];
         const float gap = line.clusters[i]->at.x - before.at.x - before.advance;
-        if (gap > minGap * span.size) {
-            if (isBlank(before) || isBlank(*line.clusters[i])) {
-                return std::nullopt;
-            }
-            widths[i] = gap;
-            least = least > 0 ? std::min(least, gap) : gap;
+        if (gaps.isBefore(i) && gap > closeEnough) {
             sum += gap;
+            ++count;
         } else if (std::abs(gap) > closeEnough ||
-                   !span.font.joinLetters(line.variant, before.text.back(),
-                                          line.clusters[i]->text.front())) {
+                   !font.joinLetters(line.variant, before.text.back(),
+                                     line.clusters[i]->text.front())) {
             return std::nullopt;
         }
     }
-    Gaps gaps;
-    int count = 0;
-    for (const float width : widths) {
-        gaps.blanks.push_back(least > 0 ? static_cast<int>(std::lround(width / least)) : 0);
-        count += gaps.blanks.back();
-        if (gaps.blanks.back() > 1) {
-            return std::nullopt;
-        }
-    }
-    gaps.width = count > 0 ? sum / static_cast<float>(count) : 0;
-    return gaps;
+    return count > 0 ? sum / static_cast<float>(count) : usual;
 }
 
 /// Returns: the position of the first glyph that takes every glyph to where it belongs, or nothing.
-std::optional<float> TextWriter::findStart(const Gaps& gaps, float wordSpacing) const {
+std::optional<float> TextWriter::findStart(const WordGaps& gaps, float width,
+                                           float wordSpacing) const {
     const float start = line.clusters.front()->at.x;
     float next = start;
     float least = 0;
     float most = 0;
     for (std::size_t i = 0; i < line.clusters.size(); ++i) {
         const TextSpan::Cluster& cluster = *line.clusters[i];
-        next += static_cast<float>(gaps.blanks[i]) * gaps.width;
+        next += gaps.isBefore(i) ? width : 0;
         least = std::min(least, next - cluster.at.x);
         most = std::max(most, next - cluster.at.x);
         next += cluster.advance + (cluster.text == u" " ? wordSpacing : 0);
@@ -192,23 +183,46 @@ std::optional<float> TextWriter::findStart(const Gaps& gaps, float wordSpacing) 
     return isClose ? std::optional(best) : std::nullopt;
 }
 
-/// Returns: whether the blanks take less room than the positions.
-bool TextWriter::isShorter(const Gaps& gaps, float wordSpacing) const {
+/// Returns: whether equal blanks take less room than the positions, those of blanks among them.
+bool TextWriter::isShorter(const WordGaps& gaps, float wordSpacing) const {
     constexpr std::size_t positionLength = 7;
+    constexpr std::size_t blankPositionLength = 4;
     constexpr std::size_t attributeLength = 22;
-    const int blanks = std::accumulate(gaps.blanks.begin(), gaps.blanks.end(), 0);
-    return static_cast<std::size_t>(blanks) + (wordSpacing == 0 ? 0 : attributeLength) <
-           positionLength * (line.placed - 1);
+    return (wordSpacing == 0 ? 0 : attributeLength) <
+           positionLength * (line.placed - 1) + blankPositionLength * gaps.size();
+}
+
+/// Puts blanks into gaps behind which a glyph has a position, which is then as it was.
+void TextWriter::insertBlanks(const WordGaps& gaps, int blank) {
+    if (gaps.isEmpty()) {
+        return;
+    }
+    Line spaced;
+    std::size_t read = 0; // characters
+    for (std::size_t i = 0; i < line.clusters.size(); ++i) {
+        if (gaps.isBefore(i) && read < line.placed) {
+            spaced.text.append(u' ');
+            spaced.x.push_back(gaps.findPlace(i));
+            spaced.glyphs.push_back({1, static_cast<std::uint16_t>(blank)});
+        }
+        const std::u16string& text = line.clusters[i]->text;
+        spaced.text.append(text.data(), static_cast<std::int32_t>(text.size()));
+        spaced.glyphs.push_back(line.glyphs[i]);
+        for (const std::size_t end = read + countCharacters(text); read < end; ++read) {
+            spaced.x.push_back(line.x[read]);
+        }
+    }
+    line.placed += spaced.x.size() - line.x.size();
+    line.text = spaced.text;
+    line.x = std::move(spaced.x);
+    line.glyphs = std::move(spaced.glyphs);
 }
 
 void TextWriter::flushLine(const TextSpan& span, const TextPaint& paint) {
     if (line.text.isEmpty()) {
         return;
     }
-    if (mode == TEXTMODE_FONTS && line.placed > 1 && !line.hasRightToLeft &&
-        canvas.getClipping() != CLIPPING_NONE) { // the lesser profiles have no word spacing
-        fillGaps(span);
-    }
+    separateWords(span);
     std::vector<MoxLength> x;
     std::transform(line.x.begin(), line.x.begin() + static_cast<std::ptrdiff_t>(line.placed),
                    std::back_inserter(x), pt);

@@ -6,6 +6,7 @@
 #include "tools/convert/ConvertOptions.h"
 #include "tools/convert/PageReport.h"
 #include "tools/convert/TextSpan.h"
+#include "tools/convert/WordGaps.h"
 
 #include <optional>
 #include <vector>
@@ -45,20 +46,16 @@ private:
         bool isFilledAlike = true; // by both rules
     };
 
-    /// Equal gaps between words.
-    struct Gaps {
-        std::vector<int> blanks; // before each cluster
-        float width = 0;         // of a blank
-    };
-
     bool isLeftOut(const TextSpan::Cluster& cluster) const;
     bool follows(const TextSpan::Cluster& cluster, int variant, TextFont& font) const;
     bool startsLine(const TextSpan::Cluster& cluster, int variant) const;
     void add(const TextSpan::Cluster& cluster, bool isNext, TextFont& font);
-    void fillGaps(const TextSpan& span);
-    std::optional<Gaps> measureGaps(const TextSpan& span) const;
-    std::optional<float> findStart(const Gaps& gaps, float wordSpacing) const;
-    bool isShorter(const Gaps& gaps, float wordSpacing) const;
+    void separateWords(const TextSpan& span);
+    bool fillGaps(const TextSpan& span, const WordGaps& gaps, int blank);
+    std::optional<float> measureBlank(TextFont& font, const WordGaps& gaps, float usual) const;
+    std::optional<float> findStart(const WordGaps& gaps, float width, float wordSpacing) const;
+    bool isShorter(const WordGaps& gaps, float wordSpacing) const;
+    void insertBlanks(const WordGaps& gaps, int blank);
     void flushLine(const TextSpan& span, const TextPaint& paint);
     void setPaint(const TextPaint& paint);
 
