@@ -51,7 +51,7 @@ struct MetricField {
 
 std::shared_ptr<FS_Face> FS_Face::open(const FS_FaceRequest& request) {
     const std::shared_ptr<FS_FontLibrary> library = FS_FontLibrary::shared();
-    const auto close = [&library](FT_Face face) { library->close(face); };
+    const auto close = [&library](FT_Face opened) { library->close(opened); };
     std::unique_ptr<FT_FaceRec, decltype(close)> opened(
         library->open(request.source, request.faceIndex), close);
     if (!opened) {
