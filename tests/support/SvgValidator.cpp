@@ -59,10 +59,10 @@ private:
 
 } // namespace
 
-void SvgValidator::DtdDeleter::operator()(_xmlDtd* dtd) const { xmlFreeDtd(dtd); }
+void SvgValidator::DtdDeleter::operator()(_xmlDtd* unused) const { xmlFreeDtd(unused); }
 
-bool SvgValidator::KnownFault::concerns(SVGConfig::SVGTYPE profile) const {
-    return std::ranges::find(profiles, profile) != profiles.end();
+bool SvgValidator::KnownFault::concerns(SVGConfig::SVGTYPE type) const {
+    return std::ranges::find(profiles, type) != profiles.end();
 }
 
 SvgValidator::SvgValidator(SVGConfig::SVGTYPE outputProfile) : profile(outputProfile) {

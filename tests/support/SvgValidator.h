@@ -18,7 +18,7 @@ public:
     /// What makes documents invalid on purpose.
     struct KnownFault {
         /// Returns: whether documents of the profile have it.
-        bool concerns(DrawmereNS::SVGConfig::SVGTYPE profile) const;
+        bool concerns(DrawmereNS::SVGConfig::SVGTYPE type) const;
 
         std::vector<DrawmereNS::SVGConfig::SVGTYPE> profiles;
         const char* start; ///< of the complaint
@@ -39,7 +39,7 @@ public:
 
 private:
     struct DtdDeleter {
-        void operator()(_xmlDtd* dtd) const;
+        void operator()(_xmlDtd* unused) const;
     };
 
     DrawmereNS::SVGConfig::SVGTYPE profile;

@@ -18,10 +18,10 @@ constexpr float farAway = 1.0e6F;
 
 /// Returns: how much `matrix` stretches what it stretches most.
 float getStretch(const fz_matrix& matrix) {
-    const double a = double{matrix.a};
-    const double b = double{matrix.b};
-    const double c = double{matrix.c};
-    const double d = double{matrix.d};
+    const double a = static_cast<double>(matrix.a);
+    const double b = static_cast<double>(matrix.b);
+    const double c = static_cast<double>(matrix.c);
+    const double d = static_cast<double>(matrix.d);
     const double sum = a * a + b * b + c * c + d * d;
     const double area = a * d - b * c;
     const double rest = std::sqrt(std::max(0.0, sum * sum - 4 * area * area));

@@ -236,11 +236,11 @@ private:
             const Vector b = -3 * u * t * t * arrival;
             const Vector rest =
                 samples.points[i] - u * u * (u + 3 * t) * from - t * t * (t + 3 * u) * to;
-            aa += double{dot(a, a)};
-            ab += double{dot(a, b)};
-            bb += double{dot(b, b)};
-            ra += double{dot(rest, a)};
-            rb += double{dot(rest, b)};
+            aa += static_cast<double>(dot(a, a));
+            ab += static_cast<double>(dot(a, b));
+            bb += static_cast<double>(dot(b, b));
+            ra += static_cast<double>(dot(rest, a));
+            rb += static_cast<double>(dot(rest, b));
         }
         const double determinant = aa * bb - ab * ab;
         ahead = static_cast<float>((ra * bb - rb * ab) / determinant);
