@@ -118,9 +118,10 @@ Ink drawByCairo(const std::string& file, float size, const std::vector<PlacedGly
     cairo_set_source_rgb(context.get(), 0, 0, 0);
     cairo_scale(context.get(), scale, scale);
     cairo_set_font_face(context.get(), face.get());
-    cairo_set_font_size(context.get(), size);
+    cairo_set_font_size(context.get(), static_cast<double>(size));
     for (const PlacedGlyph& glyph : glyphs) {
-        const cairo_glyph_t placed = {glyph.id, glyph.x, glyph.y};
+        const cairo_glyph_t placed = {glyph.id, static_cast<double>(glyph.x),
+                                      static_cast<double>(glyph.y)};
         cairo_glyph_path(context.get(), &placed, 1);
         cairo_fill(context.get());
     }
