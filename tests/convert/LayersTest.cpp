@@ -187,6 +187,20 @@ TEST(Layers, TextClipsWhatComesAfterIt) {
     EXPECT_GT(page.count("clipPath"), 0);
 }
 
+TEST(Layers, StrokedTextThatAShadingShowsThroughHasAGradientForItsPen) {
+    const std::string text = "BT /F 40 Tf 1 Tr 6 w /Pattern CS /P SCN 10 30 Td (Hello) Tj ET";
+    const DrawnPage page({text, "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica>>>>"
+                                "/Pattern<</P<</PatternType 2/Shading<</ShadingType 2"
+                                "/ColorSpace/DeviceRGB/Coords[0 0 200 0]/Function<</FunctionType 2"
+                                "/Domain[0 1]/C0[1 0 0]/C1[0 0 1]/N 1>>>>>>>>"});
+    EXPECT_EQ(page.count("linearGradient"), 1);
+    EXPECT_EQ(page.count("path"), 1);
+    EXPECT_EQ(page.attribute("path", "stroke"),
+              "url(#" + page.attribute("linearGradient", "id") + ")");
+    EXPECT_EQ(page.attribute("path", "fill"), "none");
+    EXPECT_THAT(page.svg, HasSubstr("stroke-width=\"6\""));
+}
+
 TEST(Layers, AMaskWithABackdropCoversWhatItsContentLeavesOut) {
     const DrawnPage page(Conversion::document("issue7891_bc1.pdf"), 0);
     EXPECT_EQ(page.count("mask"), 1);
