@@ -99,6 +99,10 @@ void Drawmere::saveDocument(MoxDocument* document, std::ostream* stream) {
     }
     SVGZipStream zip(*stream);
     document->save(config->encoding, none, zip, nullptr, config->saveOption, none);
+    // What the document itself had to refuse is known to the outer stream alone.
+    if (!zip.good() && stream->good()) {
+        stream->setstate(std::ios::badbit);
+    }
 }
 
 void Drawmere::finish() {

@@ -42,27 +42,6 @@ std::size_t countCharacters(std::size_t bytes) {
     return (bytes + tripleBytes - 1) / tripleBytes * quadCharacters;
 }
 
-/// Returns: the length of the text of `bytes` bytes, with its line feeds.
-std::size_t countText(std::size_t bytes) {
-    return countCharacters(bytes) + bytes / SVGBase64Lines::lineBytes;
-}
-
-/// Writes the text of `size` bytes and nothing behind it. Returns: its end.
-char* encode(const char* in, std::size_t size, char* out) {
-    const std::size_t lines = size / SVGBase64Lines::lineBytes;
-    SVGBase64Lines::encode(in, lines, out);
-    const char* const end = in + size;
-    in += lines * SVGBase64Lines::lineBytes;
-    out += lines * SVGBase64Lines::lineSize;
-    while (in != end) {
-        const std::size_t count = std::min<std::size_t>(end - in, tripleBytes);
-        SVGBase64::EncodeByteTriple(in, count, out);
-        in += count;
-        out += quadCharacters;
-    }
-    return out;
-}
-
 /// Reads by `read(bytes, count)`, which answers how many came, until less than a chunk came, and
 /// gives each chunk to `take(bytes, count)`, which answers `SUCCESS` to go on. All chunks but the
 /// last are whole lines, so the texts of the chunks make up the text of all.
@@ -88,11 +67,11 @@ public:
     TextBuffer(char* out, std::size_t outSize) : cursor(out), room(outSize) {}
 
     int operator()(const char* bytes, std::size_t count) {
-        const std::size_t length = countText(count);
+        const std::size_t length = SVGBase64Lines::countText(count);
         if (length > room) {
             return SVGBase64::NO_MEMORY;
         }
-        cursor = encode(bytes, count, cursor);
+        cursor = SVGBase64Lines::encodeText(bytes, count, cursor);
         room -= length;
         return SVGBase64::SUCCESS;
     }
@@ -152,7 +131,7 @@ void SVGBase64::EncodeByteTriple(const char* in, unsigned long count, char* out)
 void SVGBase64::EncodeBuffer(const char* in, unsigned long size, char* out) {
     const int outSize = CalculateRecquiredEncodeOutputBufferSize(size);
     if (outSize > 0) {
-        char* const end = encode(in, size, out);
+        char* const end = SVGBase64Lines::encodeText(in, size, out);
         std::fill(end, out + outSize, '\0');
     }
 }
@@ -170,13 +149,15 @@ int SVGBase64::EncodeFile(const char* source, const char* target) {
     if (!out) {
         return NO_TARGET;
     }
-    const std::unique_ptr<char[]> text(new (std::nothrow) char[countText(chunkBytes)]);
+    const std::unique_ptr<char[]> text(
+        new (std::nothrow) char[SVGBase64Lines::countText(chunkBytes)]);
     if (!text) {
         return NO_MEMORY;
     }
     const int result =
         encodeChunks(makeReader(in.get()), [&](const char* bytes, std::size_t count) {
-            const std::size_t length = encode(bytes, count, text.get()) - text.get();
+            const std::size_t length =
+                SVGBase64Lines::encodeText(bytes, count, text.get()) - text.get();
             return std::fwrite(text.get(), 1, length, out.get()) == length ? SUCCESS : NO_TARGET;
         });
     const bool isWritten = std::fclose(out.release()) == 0;

@@ -2,7 +2,9 @@
 
 #include "images/SVGBase64.h"
 
+#include <algorithm>
 #include <cstdint>
+#include <cstring>
 
 #if defined(__x86_64__) && defined(__GNUC__)
 #define DRAWMERE_VECTOR_BASE64
@@ -13,10 +15,11 @@ namespace DrawmereNS {
 namespace {
 
 constexpr std::size_t tripleBytes = 3;
+constexpr std::size_t quadCharacters = 4;
 
 unsigned int toBits(char byte) { return static_cast<unsigned char>(byte); }
 
-void encodePlain(const char* in, std::size_t lines, char* out) {
+void encodePlain(const char* in, std::size_t lines, char* out, std::size_t distance) {
     const char* const alphabet = SVGBase64::BASE64_ALPHABET;
     for (std::size_t line = 0; line < lines; ++line) {
         for (std::size_t i = 0; i < SVGBase64Lines::lineBytes; i += tripleBytes) {
@@ -27,8 +30,8 @@ void encodePlain(const char* in, std::size_t lines, char* out) {
             *out++ = alphabet[bits >> 6U & 0x3FU];
             *out++ = alphabet[bits & 0x3FU];
         }
-        *out++ = '\n';
         in += SVGBase64Lines::lineBytes;
+        out += distance - SVGBase64Lines::lineCharacters;
     }
 }
 
@@ -79,7 +82,8 @@ __attribute__((target("ssse3"))) inline __m128i encodeShuffled(__m128i bytes) {
     return _mm_add_epi8(fields, shifts);
 }
 
-__attribute__((target("ssse3"))) void encodeSsse3(const char* in, std::size_t lines, char* out) {
+__attribute__((target("ssse3"))) void encodeSsse3(const char* in, std::size_t lines, char* out,
+                                                  std::size_t distance) {
     const __m128i shuffle = loadVector(fieldShuffle);
     const __m128i endShuffle = loadVector(fieldShuffle + 16);
     for (std::size_t line = 0; line < lines; ++line) {
@@ -90,9 +94,8 @@ __attribute__((target("ssse3"))) void encodeSsse3(const char* in, std::size_t li
         // Bytes 45 to 57, read together with the four before them: behind them there may be none.
         const __m128i bytes = _mm_shuffle_epi8(loadVector(in + 41), endShuffle);
         _mm_storeu_si128(reinterpret_cast<__m128i*>(out + 60), encodeShuffled(bytes));
-        out[SVGBase64Lines::lineCharacters] = '\n';
         in += SVGBase64Lines::lineBytes;
-        out += SVGBase64Lines::lineSize;
+        out += distance;
     }
 }
 
@@ -123,14 +126,14 @@ __attribute__((target("avx2"))) inline void encodeVector(const char* in, char* o
                         encodeShuffled(_mm256_shuffle_epi8(bytes, shuffle)));
 }
 
-__attribute__((target("avx2"))) void encodeAvx2(const char* in, std::size_t lines, char* out) {
+__attribute__((target("avx2"))) void encodeAvx2(const char* in, std::size_t lines, char* out,
+                                                std::size_t distance) {
     for (std::size_t line = 0; line < lines; ++line) {
         encodeVector(in, out);
         encodeVector(in + 24, out + 32);
         encodeVector(in + 33, out + 44);
-        out[SVGBase64Lines::lineCharacters] = '\n';
         in += SVGBase64Lines::lineBytes;
-        out += SVGBase64Lines::lineSize;
+        out += distance;
     }
 }
 
@@ -146,6 +149,29 @@ constexpr SVGBase64Lines::Variant variants[] = {
     {"plain", encodePlain, isAlwaysSupported},
 };
 
+/// Writes `lineEnd` behind each line, from the end of the first on.
+template <std::size_t size> void writeEnds(std::size_t lines, char* out, const char* lineEnd) {
+    for (std::size_t line = 0; line < lines; ++line) {
+        std::memcpy(out, lineEnd, size);
+        out += SVGBase64Lines::lineCharacters + size;
+    }
+}
+
+/// The ends that texts have get loops of their own: a copy of known size takes no call.
+void endLines(std::size_t lines, char* out, std::string_view lineEnd) {
+    constexpr std::size_t character = 1;
+    constexpr std::size_t reference = 5;
+    if (lineEnd.size() == character) {
+        writeEnds<character>(lines, out, lineEnd.data());
+    } else if (lineEnd.size() == reference) {
+        writeEnds<reference>(lines, out, lineEnd.data());
+    } else {
+        for (std::size_t line = 0; line < lines; ++line) {
+            out = std::copy(lineEnd.begin(), lineEnd.end(), out) + SVGBase64Lines::lineCharacters;
+        }
+    }
+}
+
 SVGBase64Lines::Encoder findFastest() {
     const SVGBase64Lines::Variant* variant = variants;
     while (!variant->isSupported()) {
@@ -158,9 +184,31 @@ SVGBase64Lines::Encoder findFastest() {
 
 std::span<const SVGBase64Lines::Variant> SVGBase64Lines::getVariants() { return variants; }
 
-void SVGBase64Lines::encode(const char* in, std::size_t lines, char* out) {
+void SVGBase64Lines::encode(const char* in, std::size_t lines, char* out,
+                            std::string_view lineEnd) {
     static const Encoder fastest = findFastest();
-    fastest(in, lines, out);
+    fastest(in, lines, out, lineCharacters + lineEnd.size());
+    endLines(lines, out + lineCharacters, lineEnd);
+}
+
+char* SVGBase64Lines::encodeText(const char* in, std::size_t size, char* out,
+                                 std::string_view lineEnd) {
+    const std::size_t lines = size / lineBytes;
+    encode(in, lines, out, lineEnd);
+    const char* const end = in + size;
+    in += lines * lineBytes;
+    out += lines * (lineCharacters + lineEnd.size());
+    while (in != end) {
+        const std::size_t count = std::min<std::size_t>(end - in, tripleBytes);
+        SVGBase64::EncodeByteTriple(in, count, out);
+        in += count;
+        out += quadCharacters;
+    }
+    return out;
+}
+
+std::size_t SVGBase64Lines::countText(std::size_t bytes) {
+    return (bytes + tripleBytes - 1) / tripleBytes * quadCharacters + bytes / lineBytes;
 }
 
 } // namespace DrawmereNS

@@ -8,6 +8,7 @@
 #include "foundation/graphicservice/GS_Graphic.h"
 #include "frontend/DrawmereError.h"
 #include "images/SVGImageElements.h"
+#include "images/SVGImageStore.h"
 #include "state/SVGGraphicContext.h"
 #include "state/SVGGroupManager.h"
 #include "tree/SVGTreeManager.h"
@@ -71,6 +72,7 @@ void SVGGraphicManager::init(SVGGroupManager* groups, SVGRefIDManager* refIds, S
                              const MoxName& conversion, int newQuality, bool /*unusedFlag*/,
                              const UnicodeString& newUnusedText) {
     dropEncodedText();
+    imageStore.reset();
     embeddedImages.clear();
     treeManager = groups ? groups->getTreeManager() : nullptr;
     groupManager = groups;

@@ -12,6 +12,7 @@
 #include <cstdint>
 #include <iosfwd>
 #include <map>
+#include <memory>
 #include <set>
 #include <vector>
 
@@ -35,7 +36,9 @@ class SVGConfig;
 class SVGElement;
 class SVGGraphicContext;
 class SVGGroupManager;
+class SVGImageStore;
 class SVGRefIDManager;
+struct SVGStoredImage;
 class SVGTreeManager;
 
 using MoxCommonNS::MoxElement;
@@ -158,8 +161,10 @@ private:
     void writeCopy(TLGraphicImage* image, const UnicodeString& path) const;
     void writeConverted(GS_RasterImage& raster, const UnicodeString& path,
                         IMAGE_CONVERT_TYPE type) const;
-    bool encodeGraphic(std::istream& source, GS_RasterImage& raster, MoxLength width,
-                       MoxLength height);
+    bool keepGraphic(std::istream& source, GS_RasterImage& raster, MoxLength width,
+                     MoxLength height, SVGStoredImage& bytes);
+    void keepBytes(std::istream& source, SVGStoredImage& bytes);
+    UnicodeString storeImage(MoxValue&& uri);
     void makeEncodedBlock(int size);
     void dropEncodedText();
     MoxValue takeDataUri(GS_GraphicType type);
@@ -167,6 +172,7 @@ private:
 
     MoxCommonNS::MoxByteBlock encodedBlock; ///< `encodedText` with room for its prefix before it
     std::size_t encodedSize = 0;
+    std::unique_ptr<SVGImageStore> imageStore; ///< that of the document; null without images
 };
 
 } // namespace DrawmereNS

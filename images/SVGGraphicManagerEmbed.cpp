@@ -9,6 +9,8 @@
 #include "images/SVGBase64.h"
 #include "images/SVGImageBytes.h"
 #include "images/SVGImageElements.h"
+#include "images/SVGImageStore.h"
+#include "images/SVGImageText.h"
 #include "refs/SVGRefIDManager.h"
 #include "state/SVGGraphicContext.h"
 #include "state/SVGGroupManager.h"
@@ -18,10 +20,12 @@
 #include <algorithm>
 #include <cmath>
 #include <limits>
+#include <utility>
 
 namespace DrawmereNS {
 
 using namespace MoxGraphicService_NS;
+using MoxCommonNS::MoxKeptText;
 using MoxCommonNS::MoxMemStream;
 
 namespace {
@@ -152,25 +156,28 @@ void SVGGraphicManager::embedGraphic(TLGraphicImage* image, MoxLength width, Mox
         useEmbededImage(known->second, width, height, x, y);
         return;
     }
-    if (!encodeGraphic(*stream, *graphic.raster, width, height)) {
+    SVGStoredImage bytes;
+    if (!keepGraphic(*stream, *graphic.raster, width, height, bytes)) {
         report(loadError);
         return;
     }
-    const UnicodeString reference = embedImage(width, height, getCnvDstType(graphic.raster));
+    const MoxPtr<MoxKeptText> uri(
+        new SVGImageText(makePrefix(getCnvDstType(graphic.raster)), std::move(bytes)));
+    const UnicodeString reference = storeImage(MoxValue::fromKept(uri));
     useEmbededImage(reference, width, height, x, y);
     if (!name.isEmpty()) {
         embeddedImages[name] = reference;
     }
 }
 
-/// Encodes the bytes of the file, or what they are converted into.
+/// Keeps the bytes of the file, or what they are converted into.
 /// Returns: false when the pixels were needed and can't be read.
-bool SVGGraphicManager::encodeGraphic(std::istream& source, GS_RasterImage& raster, MoxLength width,
-                                      MoxLength height) {
+bool SVGGraphicManager::keepGraphic(std::istream& source, GS_RasterImage& raster, MoxLength width,
+                                    MoxLength height, SVGStoredImage& bytes) {
     const bool isDownsampled = execDownsample(&raster, width, height);
     IMAGE_CONVERT_TYPE type = CONVERT_BMP_JPEG;
     if (!isRequiredImageConvert(&raster, &type, isDownsampled)) {
-        base64Encoding(source);
+        keepBytes(source, bytes);
         return true;
     }
     MoxMemStream converted(nullptr, convertedSize, /*ownsSource=*/false);
@@ -178,8 +185,22 @@ bool SVGGraphicManager::encodeGraphic(std::istream& source, GS_RasterImage& rast
     if (raster.getFailure() != FAILURE_NONE) {
         return false;
     }
-    base64Encoding(converted);
+    keepBytes(converted, bytes);
     return true;
+}
+
+/// Keeps what a stream holds; one that can't be read holds nothing.
+void SVGGraphicManager::keepBytes(std::istream& source, SVGStoredImage& bytes) {
+    const std::streamoff length = std::max<std::streamoff>(0, SVGImageBytes::start(source));
+    if (SVGBase64::CalculateRecquiredEncodeOutputBufferSize(length) < 1) {
+        DrawmereError::throwError(encodingError);
+    }
+    if (!imageStore) {
+        imageStore = std::make_unique<SVGImageStore>();
+    }
+    if (!imageStore->keep(source, static_cast<std::size_t>(length), bytes)) {
+        DrawmereError::throwError(encodingError);
+    }
 }
 
 bool SVGGraphicManager::execDownsample(GS_RasterImage* raster, MoxLength width,
@@ -255,13 +276,17 @@ MoxValue SVGGraphicManager::takeDataUri(GS_GraphicType type) {
 
 UnicodeString SVGGraphicManager::embedImage(MoxLength /*width*/, MoxLength /*height*/,
                                             GS_GraphicType type) {
+    return storeImage(takeDataUri(type));
+}
+
+UnicodeString SVGGraphicManager::storeImage(MoxValue&& uri) {
     const UnicodeString id = refIdManager->createReferenceID(SVGRefIDManager::REFIMAGE);
     const MoxPtr<SVGElement> image = treeManager->document->createSVGElement(SVGName::image);
     image->setSVGAttribute(SVGName::id, MoxValue(id));
     image->setSVGAttribute(SVGName::width, u"100%");
     image->setSVGAttribute(SVGName::height, u"100%");
     image->setSVGAttribute(SVGName::preserveAspectRatio, imageAspect);
-    image->setAttribute(getHrefName(), takeDataUri(type));
+    image->setAttribute(getHrefName(), std::move(uri));
     treeManager->findDefs(treeManager->document->getDocumentElement());
     treeManager->addElement(image.get(), /*makeCurrent=*/false);
     return UnicodeString(u'#') + id;

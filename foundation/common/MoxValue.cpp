@@ -1,6 +1,7 @@
 #include "foundation/common/MoxValue.h"
 
 #include "foundation/common/MoxAsciiChars.h"
+#include "foundation/common/MoxKeptText.h"
 #include "foundation/common/MoxMutex.h"
 #include "foundation/common/MoxNameTable.h"
 #include "foundation/common/MoxNamedValueMap.h"
@@ -204,6 +205,14 @@ MoxValue MoxValue::adoptAscii(MoxByteBlock block, std::size_t begin, std::size_t
     return result;
 }
 
+MoxValue MoxValue::fromKept(const MoxPtr<MoxKeptText>& text) {
+    MoxValue result;
+    text->addRef();
+    result.store(MOXVALUE_STRING, static_cast<const MoxKeptText*>(text.get()));
+    result.form = keptForm;
+    return result;
+}
+
 void MoxValue::storeAscii(std::string_view text) {
     type = MOXVALUE_STRING;
     if (text.size() <= inlineCapacity) {
@@ -233,6 +242,10 @@ void MoxValue::cloneHeap() {
         storeAscii(load<AdoptedText*>()->text);
         return;
     }
+    if (form == keptForm) {
+        getKeptText()->addRef();
+        return;
+    }
     MoxMutex::interlockedIncrement(load<HeapText*>()->users);
 }
 
@@ -241,6 +254,8 @@ void MoxValue::freeHeap() {
         delete load<MoxNamedValueMap*>();
     } else if (form == adoptedForm) {
         delete load<AdoptedText*>();
+    } else if (form == keptForm) {
+        getKeptText()->release();
     } else {
         releaseText();
     }
@@ -261,6 +276,9 @@ std::string_view MoxValue::getAsciiText() const {
     if (form == adoptedForm) {
         return load<AdoptedText*>()->text;
     }
+    if (form == keptForm) {
+        return getKeptText()->getText();
+    }
     return type == MOXVALUE_STRING && form <= inlineCapacity ? std::string_view(bytes, form)
                                                              : std::string_view();
 }
@@ -274,6 +292,9 @@ std::u16string_view MoxValue::getWideText() const {
 }
 
 bool MoxValue::equalText(const MoxValue& other) const {
+    if (form == keptForm && getKeptText() == other.getKeptText()) {
+        return true;
+    }
     // A text that is ASCII is never kept wide, so texts of two forms differ.
     return isWideText() == other.isWideText() && getAsciiText() == other.getAsciiText() &&
            getWideText() == other.getWideText();

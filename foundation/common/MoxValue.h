@@ -6,6 +6,7 @@
 #include "foundation/common/MoxColor.h"
 #include "foundation/common/MoxLength.h"
 #include "foundation/common/MoxName.h"
+#include "foundation/common/MoxPtr.h"
 #include "foundation/common/MoxUnitType.h"
 
 #include <cstddef>
@@ -15,6 +16,7 @@
 
 namespace MoxCommonNS {
 
+class MoxKeptText;
 class MoxNamedValueMap;
 
 /// What a `MoxValue` holds.
@@ -117,6 +119,12 @@ public:
     /// Shape: `length` bytes from `begin` on, all of them ASCII; their count fits into an int.
     static MoxValue adoptAscii(MoxByteBlock block, std::size_t begin, std::size_t length);
 
+    /// A string value whose text is kept in another form, and made as a whole when it is asked for:
+    /// whatever reads it may throw `std::bad_alloc`, or `std::ios_base::failure` when the text
+    /// can't be had any more. Copies of the value share it.
+    /// Shape: `text`, not null.
+    static MoxValue fromKept(const MoxPtr<MoxKeptText>& text);
+
     /// True when type and content agree; the key plays no part, and a NaN differs from everything.
     bool operator==(const MoxValue& other) const;
 
@@ -170,6 +178,12 @@ public:
     /// Returns: the UTF-16 units of a wide string, valid as long as the value.
     std::u16string_view getWideText() const;
 
+    /// Returns: the text of a string that is kept in another form, valid as long as the value; null
+    /// for every other value.
+    const MoxKeptText* getKeptText() const {
+        return form == keptForm ? load<const MoxKeptText*>() : nullptr;
+    }
+
     /// Returns: the single-precision number of a real or of a length in points.
     float getFloat() const { return load<float>(); }
 
@@ -178,7 +192,8 @@ private:
     struct HeapText;
 
     static constexpr std::size_t inlineCapacity = 10;
-    static constexpr std::uint8_t firstHeapForm = 0xFC;
+    static constexpr std::uint8_t firstHeapForm = 0xFB;
+    static constexpr std::uint8_t keptForm = 0xFB;
     static constexpr std::uint8_t adoptedForm = 0xFC;
     static constexpr std::uint8_t mapForm = 0xFD;
     static constexpr std::uint8_t asciiForm = 0xFE;

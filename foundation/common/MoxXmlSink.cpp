@@ -8,12 +8,12 @@
 #include <numeric>
 #include <ostream>
 #include <string>
-#include <utility>
 #include <unicode/ucnv.h>
 #include <unicode/ucnv_cb.h>
 #include <unicode/ucnv_err.h>
 #include <unicode/uniset.h>
 #include <unicode/uset.h>
+#include <utility>
 
 namespace MoxCommonNS {
 namespace {
@@ -144,6 +144,8 @@ void MoxXmlSink::finish() {
     handOn(buffer.data(), cursor - buffer.data(), /*isLast=*/true);
     cursor = buffer.data();
 }
+
+void MoxXmlSink::fail() { stream.setstate(std::ios::badbit); }
 
 void MoxXmlSink::writeLong(std::string_view bytes) {
     flushBuffer();

@@ -63,6 +63,9 @@ public:
     /// Hands on all that is left; nothing may be written afterwards.
     void finish();
 
+    /// Puts the stream into a failed state, and nothing more is written.
+    void fail();
+
     static constexpr std::size_t maxRoom = 4096;
 
 private:

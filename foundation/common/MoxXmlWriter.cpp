@@ -18,6 +18,8 @@ namespace {
 /// Deeper levels are indented like this one, so that a deep tree does not grow by its square.
 constexpr std::size_t maxIndentedDepth = 64;
 
+constexpr std::string_view lineFeedReference = "&#10;";
+
 struct Escape {
     char character;
     bool onlyInAttributes;
@@ -27,8 +29,9 @@ struct Escape {
 // A line feed or a tab in an attribute, and a carriage return anywhere, would be changed by a
 // reader. What the byte of a delete character means differs from reader to reader.
 constexpr Escape escapes[] = {
-    {'<', false, "&lt;"}, {'&', false, "&amp;"}, {'>', false, "&gt;"},   {'"', true, "&quot;"},
-    {'\t', true, "&#9;"}, {'\n', true, "&#10;"}, {'\r', false, "&#13;"}, {'\x7F', false, "&#127;"},
+    {'<', false, "&lt;"},   {'&', false, "&amp;"},     {'>', false, "&gt;"},
+    {'"', true, "&quot;"},  {'\t', true, "&#9;"},      {'\n', true, lineFeedReference},
+    {'\r', false, "&#13;"}, {'\x7F', false, "&#127;"},
 };
 
 /// Bit 1: not as it is in text; bit 2: not as it is in an attribute.
@@ -279,7 +282,11 @@ void MoxXmlWriter::writeAttribute(std::string_view name, const MoxValue& value) 
 void MoxXmlWriter::writeValue(const MoxValue& value) {
     switch (value.getType()) {
     case MOXVALUE_STRING:
-        writeText(value, /*inAttribute=*/true);
+        if (const MoxKeptText* const kept = value.getKeptText()) {
+            writeKept(*kept);
+        } else {
+            writeText(value, /*inAttribute=*/true);
+        }
         return;
     case MOXVALUE_REAL:
         writeReal(value.getFloat());
@@ -339,6 +346,15 @@ void MoxXmlWriter::writeAscii(std::string_view text, bool inAttribute) {
         i = findXmlMarkup(text, i + 1);
     }
     sink.write(text.substr(start));
+}
+
+/// A document with a hole must not pass for a whole one, so a text that is lost ends the writing.
+void MoxXmlWriter::writeKept(const MoxKeptText& text) {
+    static_assert(lineFeedReference.size() <= MoxKeptText::maxLineFeed);
+    const auto write = [this](std::string_view piece) { sink.write(piece); };
+    if (!text.handOut(lineFeedReference, write)) {
+        sink.fail();
+    }
 }
 
 void MoxXmlWriter::writeWide(std::u16string_view text, bool inAttribute) {

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "foundation/common/MoxDocument.h"
+#include "foundation/common/MoxKeptText.h"
 #include "foundation/common/MoxNameTable.h"
 #include "foundation/common/MoxXmlOptions.h"
 #include "foundation/common/MoxXmlSink.h"
@@ -48,6 +49,7 @@ private:
     void writeNameText(MoxName name);
     void writeText(const MoxValue& text, bool inAttribute);
     void writeAscii(std::string_view text, bool inAttribute);
+    void writeKept(const MoxKeptText& text);
     void writeWide(std::u16string_view text, bool inAttribute);
     void writeEscaped(UChar32 codePoint, bool inAttribute);
     void breakLine();

@@ -1,6 +1,8 @@
 // Runs that fail: what is told to whom, and what survives.
 #include "draw/DrawmereImpl.h"
+#include "foundation/common/MoxKeptText.h"
 #include "tests/frontend/RunFiles.h"
+#include "tree/SVGTreeManager.h"
 
 #include <gtest/gtest.h>
 
@@ -125,6 +127,58 @@ TEST(DrawmereFailure, TheCallersStreamIsNotFlushedSoItsFlushTellsOfASmallDocumen
     full.run.drawmere.finish();
     EXPECT_TRUE(full.stream.good());
     EXPECT_FALSE(full.stream.flush().good());
+}
+
+/// A text that can't be read back when the document is written.
+class LostText : public MoxCommonNS::MoxKeptText {
+public:
+    std::size_t getLength() const override { return 1; }
+
+    bool handOut(std::string_view /*lineFeed*/, const Taker& /*take*/) const override {
+        return false;
+    }
+};
+
+void loseText(Drawmere& drawmere) {
+    drawmere.impl->treeManager->document->getDocumentElement()->setAttribute(
+        MoxName(u"lost"), MoxValue::fromKept(new LostText));
+}
+
+TEST(DrawmereFailure, ATextThatIsLostIsToldLikeAFullDisk) {
+    for (const bool gzip : {false, true}) {
+        RunFiles run;
+        run.config.gzip = gzip;
+        run.open();
+        run.begin(1);
+        loseText(run.drawmere);
+        EXPECT_EQ(errorOf([&run] { run.drawmere.finishRootSvg(); }),
+                  unwritable(run.directory.path("out1.svg")));
+    }
+}
+
+TEST(DrawmereFailure, ATextThatIsLostIsToldForTheCallersStream) {
+    for (const bool gzip : {false, true}) {
+        for (const bool throws : {false, true}) {
+            RunFiles run;
+            run.config.streamOutput = true;
+            run.config.gzip = gzip;
+            std::ostringstream stream;
+            run.drawmere.initRootSvg(&stream);
+            run.begin(1);
+            loseText(run.drawmere);
+            run.drawmere.finishRootSvg();
+            RememberingHandler handler;
+            run.drawmere.setErrorHandler(&handler);
+            if (throws) {
+                stream.exceptions(std::ios::badbit);
+            }
+            run.drawmere.finish();
+            EXPECT_EQ(handler.told, throws
+                                        ? "other\n"
+                                        : "16414 Specified uri that svg output couldn't create.\n");
+            EXPECT_TRUE(stream.bad());
+        }
+    }
 }
 
 TEST(DrawmereFailure, TheEndOfARunStopsAtTheFirstPageThatFails) {

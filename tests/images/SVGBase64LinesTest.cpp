@@ -35,14 +35,16 @@ std::string makeLines(std::size_t lines) {
 }
 
 /// Returns: the text that a variant makes of `bytes`, from memory that ends with it to memory that
-/// ends with the text, so that a checker sees any step beyond them.
+/// ends with the text, so that a checker sees any step beyond them. It leaves the line feeds alone,
+/// which stand there before.
 std::string encodeBy(SVGBase64Lines::Encoder encoder, const std::string& bytes) {
     const std::size_t lines = bytes.size() / SVGBase64Lines::lineBytes;
     const std::size_t size = lines * SVGBase64Lines::lineSize;
     const auto in = std::make_unique<char[]>(bytes.size());
     const auto out = std::make_unique<char[]>(size);
     bytes.copy(in.get(), bytes.size());
-    encoder(in.get(), lines, out.get());
+    std::fill_n(out.get(), size, '\n');
+    encoder(in.get(), lines, out.get(), SVGBase64Lines::lineSize);
     return {out.get(), size};
 }
 
@@ -76,9 +78,40 @@ TEST(SVGBase64Lines, TheLastVariantRunsEverywhere) {
     EXPECT_TRUE(last.isSupported());
 }
 
-TEST(SVGBase64Lines, TheChosenVariantWritesTheSameText) {
-    const std::string bytes = makeLines(7);
-    EXPECT_EQ(encodeBy(SVGBase64Lines::encode, bytes), encodeByTriples(bytes));
+/// Returns: `text` with `lineEnd` in the place of each line feed.
+std::string replaceLineFeeds(const std::string& text, std::string_view lineEnd) {
+    std::string result;
+    for (const char c : text) {
+        result.append(c == '\n' ? lineEnd : std::string_view(&c, 1));
+    }
+    return result;
+}
+
+TEST(SVGBase64Lines, TheChosenVariantEndsLinesAsItIsTold) {
+    for (const std::size_t lines : {0, 1, 7}) {
+        const std::string bytes = makeLines(lines);
+        const std::string text = encodeByTriples(bytes);
+        for (const std::string_view lineEnd : {"\n", "&#10;", "", "12345678"}) {
+            const std::string expected = replaceLineFeeds(text, lineEnd);
+            const auto out = std::make_unique<char[]>(expected.size());
+            SVGBase64Lines::encode(bytes.data(), lines, out.get(), lineEnd);
+            EXPECT_EQ(std::string_view(out.get(), expected.size()), expected);
+        }
+    }
+}
+
+TEST(SVGBase64Lines, ALineThatIsNotFullHasNoEnd) {
+    for (const std::size_t size : {0, 1, 2, 3, 56, 57, 58, 113, 114, 115}) {
+        const std::string bytes = makeLines(3).substr(0, size);
+        std::string text(DrawmereNS::SVGBase64::CalculateRecquiredEncodeOutputBufferSize(size), 0);
+        DrawmereNS::SVGBase64::EncodeBuffer(bytes.data(), size, text.data());
+        text.resize(text.find('\0'));
+        EXPECT_EQ(SVGBase64Lines::countText(size), text.size());
+        const std::string expected = replaceLineFeeds(text, "&#10;");
+        const auto out = std::make_unique<char[]>(expected.size());
+        const char* const end = SVGBase64Lines::encodeText(bytes.data(), size, out.get(), "&#10;");
+        EXPECT_EQ(std::string_view(out.get(), end), expected);
+    }
 }
 
 } // namespace

@@ -1,7 +1,10 @@
 #include "images/SVGGraphicManager.h"
 
+#include "images/SVGBase64Lines.h"
+#include "images/SVGImageStore.h"
 #include "tests/images/FakeRaster.h"
 #include "tests/images/ImagePage.h"
+#include "tests/support/OpenFiles.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -216,6 +219,69 @@ TEST(SVGGraphicManager, ReferredImageClosesAGroupOfShapes) {
     EXPECT_FALSE(shapes->getFirstChild()->getNextSibling());
     EXPECT_TRUE(images->getFirstChild()->getNextSibling());
     EXPECT_FALSE(images->getNextSibling());
+}
+
+// Where the bytes of embedded images wait.
+
+/// Lets files without a name go into a directory of their own.
+class OwnTempDir {
+public:
+    OwnTempDir() { setenv("TMPDIR", directory.path().c_str(), 1); }
+
+    OwnTempDir(const OwnTempDir&) = delete;
+    OwnTempDir& operator=(const OwnTempDir&) = delete;
+
+    ~OwnTempDir() { before.empty() ? unsetenv("TMPDIR") : setenv("TMPDIR", before.c_str(), 1); }
+
+    int countFiles() const { return countOpenFiles(directory.path()); }
+
+private:
+    TempDir directory; // before the variable tells of itself
+    std::string before = std::getenv("TMPDIR") ? std::getenv("TMPDIR") : "";
+};
+
+TEST(SVGGraphicManager, BytesBeyondTheBudgetOfADocumentGoIntoAFile) {
+    const OwnTempDir place;
+    std::string bytes = makePng(2, 2);
+    bytes.resize(SVGImageStore::memoryBudget); // a reader stops at the end of the image
+    TalGraphic::TLMemoryImage whole(bytes);
+    TalGraphic::TLMemoryImage part(std::string_view(bytes).substr(0, 1000));
+    MoxPtr<MoxDocument> document;
+    {
+        ImagePage page;
+        page.drawApart(whole);
+        EXPECT_EQ(place.countFiles(), 0);
+        page.drawApart(part);
+        EXPECT_EQ(place.countFiles(), 1);
+        EXPECT_THAT(page.errors(), IsEmpty());
+        ImagePage other; // with a budget of its own
+        other.drawApart(part);
+        EXPECT_EQ(place.countFiles(), 1);
+        document = page.impl.getDocument();
+    }
+    const MoxNode* const image =
+        document->getDocumentElement()->getFirstChild()->getFirstChild()->getNextSibling();
+    const MoxValue uri =
+        MoxCommonNS::narrow<MoxElement>(image)->getAttribute(MoxName(u"xlink:href"));
+    std::string text(SVGBase64Lines::countText(1000), '\0');
+    SVGBase64Lines::encodeText(bytes.data(), 1000, text.data());
+    EXPECT_EQ(uri.getAsciiText(), "data:image/png;base64,\n" + text);
+    document = nullptr;
+    EXPECT_EQ(place.countFiles(), 1); // the value is its last owner
+}
+
+TEST(SVGGraphicManager, ANewDocumentHasTheWholeBudgetAgain) {
+    const OwnTempDir place;
+    std::string bytes = makePng(2, 2);
+    bytes.resize(SVGImageStore::memoryBudget);
+    TalGraphic::TLMemoryImage image(bytes);
+    ImagePage page;
+    for (int document = 0; document < 2; ++document) {
+        page.manager().init(page.impl.groupManager, page.impl.refIdManager, &page.config, u"", u"",
+                            MoxName(), 7, true, u"");
+        page.drawApart(image);
+    }
+    EXPECT_EQ(place.countFiles(), 0);
 }
 
 } // namespace
