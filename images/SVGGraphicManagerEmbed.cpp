@@ -191,6 +191,7 @@ bool SVGGraphicManager::keepGraphic(std::istream& source, GS_RasterImage& raster
 
 /// Keeps what a stream holds; one that can't be read holds nothing.
 void SVGGraphicManager::keepBytes(std::istream& source, SVGStoredImage& bytes) {
+    dropEncodedText(); // of an image that nobody has stored, and which this one replaces
     const std::streamoff length = std::max<std::streamoff>(0, SVGImageBytes::start(source));
     if (SVGBase64::CalculateRecquiredEncodeOutputBufferSize(length) < 1) {
         DrawmereError::throwError(encodingError);

@@ -2,6 +2,7 @@
 
 #include <cerrno>
 #include <cstdlib>
+#include <utility>
 
 #include <fcntl.h>
 #include <sys/resource.h>
@@ -25,6 +26,20 @@ template <typename Transfer> bool moveAll(std::size_t count, Transfer transfer) 
     return true;
 }
 
+/// Takes the first of the files that `directory` gives, -1 for none.
+int openFile(const std::string& directory) {
+    const int unnamed = MoxTempFile::openUnnamed(directory);
+    return unnamed >= 0 ? unnamed : MoxTempFile::openUnlinked(directory);
+}
+
+/// Documents that wait for their links have a file each. Half of the descriptors that the process
+/// may have are left for all else, such as the files of finished pages.
+bool leavesRoom(int descriptor) {
+    rlimit limit = {};
+    return getrlimit(RLIMIT_NOFILE, &limit) == 0 &&
+           static_cast<rlim_t>(descriptor) < limit.rlim_cur / 2;
+}
+
 } // namespace
 
 std::string MoxTempFile::getDirectory() {
@@ -33,15 +48,13 @@ std::string MoxTempFile::getDirectory() {
 }
 
 MoxPtr<MoxTempFile> MoxTempFile::make(const std::string& directory) {
-    int descriptor = openUnnamed(directory);
-    if (descriptor < 0) {
-        descriptor = openUnlinked(directory);
-    }
+    const int descriptor = openFile(directory);
     if (descriptor < 0) {
         return {};
     }
     try {
-        return {new MoxTempFile(descriptor)};
+        MoxPtr<MoxTempFile> file(new MoxTempFile(descriptor)); // which closes it
+        return leavesRoom(descriptor) ? std::move(file) : MoxPtr<MoxTempFile>();
     } catch (...) { // no memory
         close(descriptor);
         throw;

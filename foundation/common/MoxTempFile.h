@@ -17,7 +17,8 @@ public:
     /// Returns: where such files go: $TMPDIR, or else /tmp.
     static std::string getDirectory();
 
-    /// Returns: an empty file in `directory`; null when none can be made there.
+    /// Returns: an empty file in `directory`; null when none can be made there, or when the process
+    /// has used up half of the descriptors that it may have.
     static MoxPtr<MoxTempFile> make(const std::string& directory);
 
     // The two ways to make one. Both return a descriptor, -1 for a failure.

@@ -33,8 +33,8 @@ enum MoxValueType : std::uint8_t {
 
 /// A tagged value. Numbers, names and texts of up to ten ASCII characters live in the value itself;
 /// a longer text, of bytes when it is ASCII and of UTF-16 otherwise, and a map live on the heap and
-/// are owned, so a copy is deep. A value that was found in a map or among attributes carries the
-/// key under which it stood.
+/// are owned, so a copy is deep. A text may also be kept in another form, see `fromKept`. A value
+/// that was found in a map or among attributes carries the key under which it stood.
 class DRAWMERE_API MoxValue {
 public:
     /// The null value: it is what a search that finds nothing answers, and its key is 0.

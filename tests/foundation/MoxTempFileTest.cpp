@@ -75,6 +75,22 @@ TEST(MoxTempFile, NeedsADirectory) {
     EXPECT_FALSE(MoxTempFile::make("/proc/self"));
 }
 
+TEST(MoxTempFile, LeavesHalfOfTheDescriptorsToOthers) {
+    const TempDir directory;
+    rlimit before = {};
+    getrlimit(RLIMIT_NOFILE, &before);
+    std::vector<MoxPtr<MoxTempFile>> files;
+    const rlimit limit = {.rlim_cur = 60, .rlim_max = before.rlim_max};
+    setrlimit(RLIMIT_NOFILE, &limit);
+    while (files.empty() || files.back()) {
+        files.push_back(MoxTempFile::make(directory.path()));
+    }
+    setrlimit(RLIMIT_NOFILE, &before);
+    files.pop_back();
+    EXPECT_LE(files.size(), 30U - 3);
+    EXPECT_EQ(countOpenFiles(directory.path()), static_cast<int>(files.size()));
+}
+
 /// Sets an environment variable until the end of its life; null takes it away.
 class Variable {
 public:

@@ -330,6 +330,17 @@ TEST(SVGGraphicManagerEmbed, UriTellsTheType) {
     }
 }
 
+TEST(SVGGraphicManagerEmbed, DrawnImageReplacesATextThatWaits) {
+    EmbedPage page;
+    std::istringstream waiting("abc");
+    page.manager().base64Encoding(waiting);
+    const std::string bytes = makePng(2, 2);
+    TLMemoryImage image(bytes);
+    page.drawApart(image);
+    EXPECT_FALSE(page.manager().encodedText);
+    EXPECT_EQ(page.uri(0), "data:image/png;base64,\n" + encode(bytes));
+}
+
 TEST(SVGGraphicManagerEmbed, IdsShareTheirSeriesWithMasks) {
     EmbedPage page;
     page.impl.refIdManager->createReferenceID(SVGRefIDManager::REFIMAGE);
