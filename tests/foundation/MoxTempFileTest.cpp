@@ -2,6 +2,7 @@
 
 #include "tests/support/OpenFiles.h"
 #include "tests/support/TempDir.h"
+#include "tests/support/TempVariable.h"
 
 #include <gtest/gtest.h>
 
@@ -16,6 +17,7 @@ namespace {
 using DrawmereTest::countOpenFiles;
 using DrawmereTest::cutOpenFiles;
 using DrawmereTest::TempDir;
+using DrawmereTest::TempVariable;
 using MoxCommonNS::MoxPtr;
 using MoxCommonNS::MoxTempFile;
 
@@ -91,28 +93,11 @@ TEST(MoxTempFile, LeavesHalfOfTheDescriptorsToOthers) {
     EXPECT_EQ(countOpenFiles(directory.path()), static_cast<int>(files.size()));
 }
 
-/// Sets an environment variable until the end of its life; null takes it away.
-class Variable {
-public:
-    explicit Variable(const char* value)
-        : before(std::getenv("TMPDIR") ? std::getenv("TMPDIR") : "") {
-        value ? setenv("TMPDIR", value, 1) : unsetenv("TMPDIR");
-    }
-
-    Variable(const Variable&) = delete;
-    Variable& operator=(const Variable&) = delete;
-
-    ~Variable() { before.empty() ? unsetenv("TMPDIR") : setenv("TMPDIR", before.c_str(), 1); }
-
-private:
-    std::string before;
-};
-
 TEST(MoxTempFile, GoesWhereTheEnvironmentSays) {
     const std::pair<const char*, const char*> rows[] = {
         {"/some/where", "/some/where"}, {"", "/tmp"}, {nullptr, "/tmp"}};
     for (const auto& [value, expected] : rows) {
-        const Variable variable(value);
+        const TempVariable variable(value);
         EXPECT_EQ(MoxTempFile::getDirectory(), expected);
     }
 }

@@ -5,6 +5,7 @@
 #include "tests/images/FakeRaster.h"
 #include "tests/images/ImagePage.h"
 #include "tests/support/OpenFiles.h"
+#include "tests/support/TempVariable.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -226,18 +227,11 @@ TEST(SVGGraphicManager, ReferredImageClosesAGroupOfShapes) {
 /// Lets files without a name go into a directory of their own.
 class OwnTempDir {
 public:
-    OwnTempDir() { setenv("TMPDIR", directory.path().c_str(), 1); }
-
-    OwnTempDir(const OwnTempDir&) = delete;
-    OwnTempDir& operator=(const OwnTempDir&) = delete;
-
-    ~OwnTempDir() { before.empty() ? unsetenv("TMPDIR") : setenv("TMPDIR", before.c_str(), 1); }
-
     int countFiles() const { return countOpenFiles(directory.path()); }
 
 private:
-    TempDir directory; // before the variable tells of itself
-    std::string before = std::getenv("TMPDIR") ? std::getenv("TMPDIR") : "";
+    TempDir directory;
+    TempVariable variable{directory.path().c_str()};
 };
 
 TEST(SVGGraphicManager, BytesBeyondTheBudgetOfADocumentGoIntoAFile) {

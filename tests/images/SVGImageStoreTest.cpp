@@ -124,12 +124,5 @@ TEST(SVGImageStore, NothingBehindTheCountIsRead) {
     }
 }
 
-TEST(SVGImageStore, MoreThanThereIsMemoryForIsRefused) {
-    SVGImageStore store(std::size_t(1) << 62U);
-    std::istringstream stream("abc");
-    SVGStoredImage image;
-    EXPECT_FALSE(store.keep(stream, std::size_t(1) << 62U, image));
-}
-
 } // namespace
 } // namespace DrawmereTest
