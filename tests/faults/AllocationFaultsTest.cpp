@@ -1,14 +1,18 @@
 // Memory gives out at every place there is, and at all that follow: nothing crashes or leaks, what
 // is lost is reported, and the next run is as good as ever.
 #include "foundation/fontservice/FS_FaceCache.h"
+#include "images/SVGImageText.h"
 #include "tests/faults/MemoryFaults.h"
 #include "tests/support/Gunzip.h"
+#include "tests/support/OpenFiles.h"
+#include "tests/support/TempDir.h"
 #include "tests/support/WholeRun.h"
 #include "tests/support/XmlReader.h"
 
 #include <gtest/gtest.h>
 
 #include <cstdlib>
+#include <sstream>
 
 namespace DrawmereTest {
 namespace {
@@ -156,6 +160,45 @@ TEST_P(AllocationFaults, EachAlone) { walk(MemoryFaults::ONE, /*usualStride=*/47
 TEST_P(AllocationFaults, AllFromOneOn) { walk(MemoryFaults::ALL_FROM_THEN_ON, /*usualStride=*/53); }
 
 INSTANTIATE_TEST_SUITE_P(Runs, AllocationFaults, testing::ValuesIn(runs), nameRun);
+
+// Images that wait in a file.
+
+/// Keeps an image in a file and reads its text. Returns: the text, nothing when there was no
+/// memory.
+std::string keepInFile(const std::string& directory, std::istream& source, std::size_t count) {
+    try {
+        SVGImageStore store(/*budget=*/0, directory);
+        SVGStoredImage image;
+        if (!store.keep(source, count, image)) {
+            return "";
+        }
+        const MoxCommonNS::MoxPtr<SVGImageText> text(new SVGImageText("", std::move(image)));
+        return std::string(text->getText());
+    } catch (const std::bad_alloc&) {
+        return "";
+    }
+}
+
+TEST(AllocationFaultsOfFiles, LoseTheImageButNoPartOfIt) {
+    const TempDir directory;
+    const std::string place = directory.path();
+    const std::string bytes(1000, 'x');
+    std::istringstream source(bytes);
+    const std::string whole = keepInFile(place, source, bytes.size());
+    std::size_t number = 0;
+    for (bool hasFailed = true; hasFailed; ++number) {
+        source.seekg(0);
+        const std::ptrdiff_t before = MemoryFaults::countLive();
+        MemoryFaults faults(MemoryFaults::ONE, number);
+        const std::string text = keepInFile(place, source, bytes.size());
+        MemoryFaults::end();
+        hasFailed = MemoryFaults::countFailed() > 0;
+        EXPECT_EQ(text, hasFailed ? "" : whole) << number;
+        EXPECT_EQ(MemoryFaults::countLive() - before, text.empty() ? 0 : 1) << number;
+        EXPECT_EQ(countOpenFiles(place), 0);
+    }
+    EXPECT_GT(number, 5U);
+}
 
 } // namespace
 } // namespace DrawmereTest
