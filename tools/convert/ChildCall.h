@@ -20,7 +20,4 @@ struct ChildResult {
 /// Throws: std::system_error when there can be no process.
 ChildResult callApart(const std::function<std::string()>& call, double seconds);
 
-/// Returns: how a process ended that a signal put an end to, by the state that `waitpid` gave.
-std::string describeBreak(int state);
-
 } // namespace DrawmereConvert

@@ -1,15 +1,13 @@
 #include "tools/convert/WorkerProcess.h"
 
-#include "tools/convert/ChildCall.h"
+#include "tools/convert/ForkedProcess.h"
 #include "tools/convert/InterruptGuard.h"
 #include "tools/convert/PageConfig.h"
 #include "tools/convert/PageWriter.h"
 
 #include <cerrno>
 #include <csignal>
-#include <system_error>
 
-#include <sys/prctl.h>
 #include <sys/socket.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -65,47 +63,21 @@ void serve(int channel, PageWriter& writer) {
     }
 }
 
-[[noreturn]] void runChild(int channel,
-                           const std::function<std::unique_ptr<PageWriter>()>& makeWriter) {
-    static_cast<void>(prctl(PR_SET_PDEATHSIG, SIGKILL));
-    static_cast<void>(std::signal(SIGPIPE, SIG_IGN)); // a reader that is gone is a failed write
-    int status = 0;
-    try {
-        const std::unique_ptr<PageWriter> writer = makeWriter();
-        serve(channel, *writer);
-    } catch (const std::exception&) {
-        status = 1;
-    }
-    _exit(status); // all else belongs to the process that it was forked off
-}
-
 } // namespace
 
 WorkerProcess::WorkerProcess(const std::function<std::unique_ptr<PageWriter>()>& makeWriter,
-                             const InterruptGuard& guard) {
-    int ends[2];
-    if (socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, ends) != 0) {
-        throw std::system_error(errno, std::generic_category());
-    }
-    child = fork();
-    if (child == 0) {
-        close(ends[0]);
-        guard.disarm();
-        runChild(ends[1], makeWriter);
-    }
-    const int failure = errno;
-    close(ends[1]);
-    channel = ends[0];
-    if (child < 0) {
-        close(channel);
-        throw std::system_error(failure, std::generic_category());
-    }
-}
+                             const InterruptGuard& guard)
+    : process(forkOff([&makeWriter, &guard](int channel) {
+          guard.disarm();
+          // A reader that is gone is a failed write.
+          static_cast<void>(std::signal(SIGPIPE, SIG_IGN));
+          serve(channel, *makeWriter());
+      })) {}
 
 WorkerProcess::~WorkerProcess() {
-    close(channel);
-    if (child > 0) {
-        kill(child, SIGKILL);
+    close(process.channel);
+    if (process.id > 0) {
+        kill(process.id, SIGKILL);
         end();
     }
 }
@@ -116,16 +88,16 @@ void WorkerProcess::start(int number, double seconds) {
         std::chrono::duration_cast<Clock::duration>(std::chrono::duration<double>(seconds));
     deadline = seconds > 0 ? Clock::now() + span : Clock::time_point::max();
     // A process that is gone is found out when its outcome is waited for.
-    sendAll(channel, &number, sizeof number);
+    sendAll(process.channel, &number, sizeof number);
 }
 
 std::optional<PageOutcome> WorkerProcess::receive() {
     std::size_t size = 0;
-    if (!receiveAll(channel, &size, sizeof size)) {
+    if (!receiveAll(process.channel, &size, sizeof size)) {
         return std::nullopt;
     }
     std::string bytes(size, '\0');
-    if (!receiveAll(channel, bytes.data(), size)) {
+    if (!receiveAll(process.channel, bytes.data(), size)) {
         return std::nullopt;
     }
     page.reset();
@@ -139,10 +111,8 @@ std::string WorkerProcess::describeEnd() {
 }
 
 int WorkerProcess::end() {
-    int state = 0;
-    while (waitpid(child, &state, 0) < 0 && errno == EINTR) {
-    }
-    child = -1;
+    const int state = waitFor(process.id);
+    process.id = -1;
     return state;
 }
 

@@ -1,6 +1,7 @@
 /// A process that converts pages, one after the other.
 #pragma once
 
+#include "tools/convert/ForkedProcess.h"
 #include "tools/convert/PageOutcome.h"
 
 #include <chrono>
@@ -8,8 +9,6 @@
 #include <memory>
 #include <optional>
 #include <string>
-
-#include <sys/types.h>
 
 namespace DrawmereConvert {
 
@@ -50,13 +49,12 @@ public:
 
     Clock::time_point getDeadline() const { return deadline; }
 
-    int getDescriptor() const { return channel; } ///< readable when there is an outcome
+    int getDescriptor() const { return process.channel; } ///< readable when there is an outcome
 
 private:
     int end();
 
-    pid_t child = -1;
-    int channel = -1;
+    ForkedProcess process;
     std::optional<int> page;
     Clock::time_point deadline = Clock::time_point::max();
 };
