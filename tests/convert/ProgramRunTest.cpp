@@ -160,6 +160,22 @@ TEST_F(ProgramRun, AStrangersIndexIsNotReplaced) {
     EXPECT_EQ(conversion.directory.read("index.html"), "<p>mine</p>");
 }
 
+TEST_F(ProgramRun, AnIndexInProgressTakesNoName) {
+    EXPECT_EQ(conversion.runShell("mkdir out; printf mine >out/index.html.part").status, 0);
+    run({"-o", "out/"});
+    EXPECT_EQ(conversion.directory.read("out/index.html.part"), "mine");
+    EXPECT_EQ(conversion.list("out").size(), 14U);
+}
+
+TEST_F(ProgramRun, NothingStaysOfAnIndexThatCantBeWritten) {
+    const std::string room = "trap '' XFSZ; ulimit -f 4; "; // for pages
+    const CommandResult result = conversion.runShell(room + "$convert a.pdf -o out/");
+    EXPECT_EQ(result.status, 1);
+    EXPECT_THAT(result.output, HasSubstr("12 pages written"));
+    EXPECT_THAT(result.output, HasSubstr("out/index.html: it can't be written\n"));
+    EXPECT_EQ(conversion.list("out").size(), 12U);
+}
+
 /// Returns: the files that the attributes `name` in a file of `out` refer to, as paths there.
 std::vector<std::string> followReferences(const Conversion& conversion, const std::string& file,
                                           const std::string& name) {

@@ -8,7 +8,7 @@
 #include <cstdio>
 #include <filesystem>
 #include <fstream>
-#include <iterator>
+#include <stdexcept>
 
 namespace DrawmereConvert {
 namespace {
@@ -63,7 +63,7 @@ private:
                          path.c_str());
             return false;
         }
-        if (!write(path)) {
+        if (!write()) {
             std::fprintf(stderr, "%s: it can't be written\n", path.c_str());
             return false;
         }
@@ -81,22 +81,22 @@ private:
         return isIndexPage(beginning);
     }
 
-    bool write(const std::string& path) const {
-        const InterruptGuard guard;
-        const std::string partial = path + ".part";
-        std::ofstream file(partial, std::ios::binary);
-        file << makeIndexPage(documents);
-        file.close();
-        std::error_code failure;
-        if (file) {
-            std::filesystem::rename(partial, path, failure);
-        }
-        if (!file || failure) {
-            std::error_code ignored;
-            std::filesystem::remove(partial, ignored);
+    /// Returns: false when the file system refuses.
+    bool write() const {
+        const InterruptGuard guard; // outlives the file in progress
+        try {
+            const PartialFiles files(directory);
+            const std::string partial = files.makeRoom(0) + indexName;
+            std::ofstream file(partial, std::ios::binary);
+            file << makeIndexPage(documents);
+            file.close();
+            if (file) {
+                files.moveOut(partial, indexName);
+            }
+            return static_cast<bool>(file);
+        } catch (const std::runtime_error&) {
             return false;
         }
-        return true;
     }
 
     int getStatus() const {
