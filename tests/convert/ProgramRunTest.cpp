@@ -107,11 +107,15 @@ TEST_F(ProgramRun, TheStandardOutputTakesTheSameDocument) {
     EXPECT_EQ(result.output, conversion.directory.read("all.svg"));
 }
 
-TEST_F(ProgramRun, AClosedStandardOutputIsAFailure) {
-    const CommandResult result = conversion.runShell("$convert a.pdf -o - >/dev/full");
-    EXPECT_EQ(result.status, 1);
-    EXPECT_THAT(result.output, HasSubstr("a.pdf: "));
-    EXPECT_THAT(result.output, HasSubstr("0 pages written, 12 failed"));
+TEST_F(ProgramRun, AStandardOutputThatTakesNoMoreIsAFailure) {
+    const std::string report = "a.pdf: the standard output takes no more\n"
+                               "a.pdf: 0 pages written, 12 failed\n";
+    for (const std::string output : {"/dev/full", ">(true); wait $!"}) { // full; closed early
+        const CommandResult result =
+            conversion.runShell("exec 3> " + output + "; $convert a.pdf -o - >&3");
+        EXPECT_EQ(result.status, 1);
+        EXPECT_EQ(result.output, report);
+    }
 }
 
 TEST_F(ProgramRun, CompressedPagesHoldTheSame) {

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <filesystem>
 #include <iostream>
+#include <stdexcept>
 
 namespace DrawmereConvert {
 namespace {
@@ -92,20 +93,36 @@ PageOutcome WholeDocumentWriter::finish() {
 }
 
 void WholeDocumentWriter::save() {
-    drawmere.setCanvasSize(toLength(size.width), toLength(size.height));
-    drawmere.finishRootSvg();
-    drawmere.finish();
     if (room.empty()) {
-        if (!std::cout.flush()) {
-            throw std::runtime_error("the standard output takes no more");
-        }
+        saveToOutput();
         return;
     }
+    close();
     for (const auto& entry : std::filesystem::directory_iterator(room)) {
         const std::string name = entry.path().filename().string();
         const bool isDocument = name == PartialFiles::nameInside(job.names.getWholeFile());
         job.files->moveOut(room + name, isDocument ? job.names.getWholeFile() : name);
     }
+}
+
+void WholeDocumentWriter::saveToOutput() {
+    try {
+        close();
+    } catch (const MoxCommonNS::MoxError&) {
+        // The library tells a stream that fails by its path, and this one has none.
+        if (std::cout) {
+            throw;
+        }
+    }
+    if (!std::cout.flush()) {
+        throw std::runtime_error("the standard output takes no more");
+    }
+}
+
+void WholeDocumentWriter::close() {
+    drawmere.setCanvasSize(toLength(size.width), toLength(size.height));
+    drawmere.finishRootSvg();
+    drawmere.finish();
 }
 
 } // namespace DrawmereConvert

@@ -21,6 +21,8 @@ private:
     void open();
     void drawPage(int page, PageOutcome& outcome);
     void save();
+    void saveToOutput();
+    void close();
 
     PageJob job;
     std::string room;
