@@ -1,4 +1,4 @@
-#include "tools/convert/PathData.h"
+#include "tools/convert/Rectangles.h"
 
 #include <gtest/gtest.h>
 
@@ -8,16 +8,7 @@ namespace DrawmereTest {
 namespace {
 
 using DrawmereConvert::PathData;
-
-PathData makeBox(float x0, float y0, float x1, float y1) {
-    PathData path;
-    path.moveTo(x0, y0);
-    path.lineTo(x1, y0);
-    path.lineTo(x1, y1);
-    path.lineTo(x0, y1);
-    path.close();
-    return path;
-}
+using DrawmereConvert::toPath;
 
 TEST(PathData, PointsAreRoundedToHundredths) {
     PathData path;
@@ -37,29 +28,29 @@ TEST(PathData, PointsOutOfReachStayInReach) {
 
 TEST(PathData, ABoxIsARectangleWhereverItBegins) {
     fz_rect rect{};
-    EXPECT_TRUE(makeBox(10, 20, 30, 50).isRectangle(rect));
-    EXPECT_TRUE(makeBox(30, 50, 10, 20).isRectangle(rect));
+    EXPECT_TRUE(toPath({10, 20, 30, 50}).isRectangle(rect));
+    EXPECT_TRUE(toPath({30, 50, 10, 20}).isRectangle(rect));
     EXPECT_FLOAT_EQ(rect.x0, 10);
     EXPECT_FLOAT_EQ(rect.y1, 50);
 }
 
 TEST(PathData, WhatIsNotUprightOrNotClosedIsNoRectangle) {
     fz_rect rect{};
-    PathData slanted = makeBox(0, 0, 10, 10);
+    PathData slanted = toPath({0, 0, 10, 10});
     slanted.points[2].x = 11;
     EXPECT_FALSE(slanted.isRectangle(rect));
-    PathData open = makeBox(0, 0, 10, 10);
+    PathData open = toPath({0, 0, 10, 10});
     open.steps.pop_back();
     EXPECT_FALSE(open.isRectangle(rect));
     EXPECT_FALSE(PathData().isRectangle(rect));
 }
 
 TEST(PathData, MovesThatNothingFollowsAreDropped) {
-    PathData path = makeBox(0, 0, 1, 1);
+    PathData path = toPath({0, 0, 1, 1});
     path.moveTo(5, 5);
     path.moveTo(6, 6);
     path.tidy();
-    EXPECT_TRUE(path == makeBox(0, 0, 1, 1));
+    EXPECT_TRUE(path == toPath({0, 0, 1, 1}));
 }
 
 TEST(PathData, BoundsHoldAllPoints) {

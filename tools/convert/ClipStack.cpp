@@ -1,5 +1,7 @@
 #include "tools/convert/ClipStack.h"
 
+#include "tools/convert/Rectangles.h"
+
 #include <algorithm>
 #include <utility>
 
@@ -19,22 +21,6 @@ bool meets(const fz_rect& one, const fz_rect& other) {
 
 bool isSame(const fz_rect& one, const fz_rect& other) {
     return one.x0 == other.x0 && one.y0 == other.y0 && one.x1 == other.x1 && one.y1 == other.y1;
-}
-
-/// MuPDF's own intersection takes a rectangle without width for an empty one; a line has none.
-fz_rect intersect(const fz_rect& one, const fz_rect& other) {
-    return {std::max(one.x0, other.x0), std::max(one.y0, other.y0), std::min(one.x1, other.x1),
-            std::min(one.y1, other.y1)};
-}
-
-PathData toPath(const fz_rect& rect) {
-    PathData path;
-    path.moveTo(rect.x0, rect.y0);
-    path.lineTo(rect.x1, rect.y0);
-    path.lineTo(rect.x1, rect.y1);
-    path.lineTo(rect.x0, rect.y1);
-    path.close();
-    return path;
 }
 
 bool isSame(const Clip& one, const Clip& other) {

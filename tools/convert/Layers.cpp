@@ -1,6 +1,7 @@
 #include "tools/convert/Layers.h"
 
-#include <algorithm>
+#include "tools/convert/Rectangles.h"
+
 #include <cmath>
 #include <utility>
 
@@ -14,13 +15,6 @@ constexpr float pixelStep = 3;
 
 constexpr MoxColor white(255, 255, 255);
 
-fz_rect intersect(const fz_rect& one, const fz_rect& other) {
-    return {std::max(one.x0, other.x0), std::max(one.y0, other.y0), std::min(one.x1, other.x1),
-            std::min(one.y1, other.y1)};
-}
-
-bool isEmpty(const fz_rect& rect) { return !(rect.x1 > rect.x0 && rect.y1 > rect.y0); }
-
 fz_rect roundOut(const fz_rect& rect) {
     return {std::floor(rect.x0 / pixelStep) * pixelStep,
             std::floor(rect.y0 / pixelStep) * pixelStep, std::ceil(rect.x1 / pixelStep) * pixelStep,
@@ -32,16 +26,6 @@ bool isClose(const fz_matrix& one, const fz_matrix& other) {
     return std::abs(one.a - other.a) < limit && std::abs(one.b - other.b) < limit &&
            std::abs(one.c - other.c) < limit && std::abs(one.d - other.d) < limit &&
            std::abs(one.e - other.e) < limit && std::abs(one.f - other.f) < limit;
-}
-
-PathData toPath(const fz_rect& rect) {
-    PathData path;
-    path.moveTo(rect.x0, rect.y0);
-    path.lineTo(rect.x1, rect.y0);
-    path.lineTo(rect.x1, rect.y1);
-    path.lineTo(rect.x0, rect.y1);
-    path.close();
-    return path;
 }
 
 } // namespace

@@ -1,19 +1,11 @@
 #include "tools/convert/LinkWriter.h"
 
+#include "tools/convert/Rectangles.h"
+
 namespace DrawmereConvert {
 namespace {
 
 const Paint unseen{MoxColor(0, 0, 0, 0)}; // black is what the root says anyway
-
-PathData toPath(const fz_rect& rect) {
-    PathData path;
-    path.moveTo(rect.x0, rect.y0);
-    path.lineTo(rect.x1, rect.y0);
-    path.lineTo(rect.x1, rect.y1);
-    path.lineTo(rect.x0, rect.y1);
-    path.close();
-    return path;
-}
 
 } // namespace
 

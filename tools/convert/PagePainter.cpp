@@ -3,6 +3,7 @@
 #include "tools/convert/BitmapTracer.h"
 #include "tools/convert/FitzCall.h"
 #include "tools/convert/PathReader.h"
+#include "tools/convert/Rectangles.h"
 
 #include <algorithm>
 #include <cmath>
@@ -14,11 +15,6 @@ namespace {
 
 int toByte(float part) {
     return static_cast<int>(std::lround(std::clamp(part, 0.0F, 1.0F) * 255.0F));
-}
-
-fz_rect intersect(const fz_rect& one, const fz_rect& other) {
-    return {std::max(one.x0, other.x0), std::max(one.y0, other.y0), std::min(one.x1, other.x1),
-            std::min(one.y1, other.y1)};
 }
 
 } // namespace
@@ -237,7 +233,7 @@ void PagePainter::clipStrokeText(const fz_text& text, const fz_stroke_state& sty
 void PagePainter::fillShade(fz_shade* shade, const fz_matrix& matrix, float alpha) {
     const fz_matrix placed = layers.place(matrix);
     const fz_rect area = intersect(fz_bound_shade(ctx, shade, placed), layers.getVisible());
-    if (!(area.x1 > area.x0 && area.y1 > area.y0)) {
+    if (isEmpty(area)) {
         return;
     }
     fillBackground(*shade, area, alpha);
