@@ -55,8 +55,8 @@ void fillPath(fz_context* ctx, fz_device* device, const fz_path* path, int isEve
               fz_matrix matrix, fz_colorspace* space, const float* color, float alpha,
               fz_color_params params) {
     paint(ctx, device, [&](PagePainter& painter) {
-        painter.fillPath(path, isEvenOdd != 0, matrix,
-                         {painter.colors.convert(space, color, alpha, params)});
+        painter.paths.fill(path, isEvenOdd != 0, matrix,
+                           {painter.colors.convert(space, color, alpha, params)});
     });
 }
 
@@ -64,15 +64,15 @@ void strokePath(fz_context* ctx, fz_device* device, const fz_path* path,
                 const fz_stroke_state* stroke, fz_matrix matrix, fz_colorspace* space,
                 const float* color, float alpha, fz_color_params params) {
     paint(ctx, device, [&](PagePainter& painter) {
-        painter.strokePath(path, *stroke, matrix,
-                           {painter.colors.convert(space, color, alpha, params)});
+        painter.paths.stroke(path, *stroke, matrix,
+                             {painter.colors.convert(space, color, alpha, params)});
     });
 }
 
 void clipPath(fz_context* ctx, fz_device* device, const fz_path* path, int isEvenOdd,
               fz_matrix matrix, fz_rect /*scissor*/) {
     paint(ctx, device,
-          [&](PagePainter& painter) { painter.clipPath(path, isEvenOdd != 0, matrix); });
+          [&](PagePainter& painter) { painter.paths.clip(path, isEvenOdd != 0, matrix); });
 }
 
 // Text in a picture can be searched for, too.
@@ -80,9 +80,10 @@ void fillText(fz_context* ctx, fz_device* device, const fz_text* text, fz_matrix
               fz_colorspace* space, const float* color, float alpha, fz_color_params params) {
     handOn(ctx, device, [&](PagePainter& painter) {
         if (painter.isSkipping()) {
-            painter.ignoreText(*text, matrix);
+            painter.texts.ignore(*text, matrix);
         } else {
-            painter.fillText(*text, matrix, {painter.colors.convert(space, color, alpha, params)});
+            painter.texts.fill(*text, matrix,
+                               {painter.colors.convert(space, color, alpha, params)});
         }
     });
 }
@@ -91,30 +92,30 @@ void strokeText(fz_context* ctx, fz_device* device, const fz_text* text,
                 const fz_stroke_state* stroke, fz_matrix matrix, fz_colorspace* space,
                 const float* color, float alpha, fz_color_params params) {
     paint(ctx, device, [&](PagePainter& painter) {
-        painter.strokeText(*text, *stroke, matrix,
-                           {painter.colors.convert(space, color, alpha, params)});
+        painter.texts.stroke(*text, *stroke, matrix,
+                             {painter.colors.convert(space, color, alpha, params)});
     });
 }
 
 void ignoreText(fz_context* ctx, fz_device* device, const fz_text* text, fz_matrix matrix) {
-    paint(ctx, device, [&](PagePainter& painter) { painter.ignoreText(*text, matrix); });
+    paint(ctx, device, [&](PagePainter& painter) { painter.texts.ignore(*text, matrix); });
 }
 
 void clipText(fz_context* ctx, fz_device* device, const fz_text* text, fz_matrix matrix,
               fz_rect /*scissor*/) {
-    paint(ctx, device, [&](PagePainter& painter) { painter.clipText(*text, matrix); });
+    paint(ctx, device, [&](PagePainter& painter) { painter.texts.clip(*text, matrix); });
 }
 
 void clipStrokePath(fz_context* ctx, fz_device* device, const fz_path* path,
                     const fz_stroke_state* stroke, fz_matrix matrix, fz_rect /*scissor*/) {
     paintCounted(ctx, device,
-                 [&](PagePainter& painter) { painter.clipStrokePath(path, *stroke, matrix); });
+                 [&](PagePainter& painter) { painter.paths.clipStroke(path, *stroke, matrix); });
 }
 
 void clipStrokeText(fz_context* ctx, fz_device* device, const fz_text* text,
                     const fz_stroke_state* stroke, fz_matrix matrix, fz_rect /*scissor*/) {
     paintCounted(ctx, device,
-                 [&](PagePainter& painter) { painter.clipStrokeText(*text, *stroke, matrix); });
+                 [&](PagePainter& painter) { painter.texts.clipStroke(*text, *stroke, matrix); });
 }
 
 void fillShade(fz_context* ctx, fz_device* device, fz_shade* shade, fz_matrix matrix, float alpha,
@@ -185,7 +186,7 @@ void endTile(fz_context* ctx, fz_device* device) {
 fz_device* makePageDevice(fz_context* ctx, PagePainter* painter) {
     PageDevice* device = fz_new_derived_device(ctx, PageDevice);
     device->painter = painter;
-    painter->device = &device->base;
+    painter->texts.device = &device->base;
     fz_device& base = device->base;
     base.fill_path = &fillPath;
     base.stroke_path = &strokePath;

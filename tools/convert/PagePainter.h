@@ -4,15 +4,13 @@
 #include "tools/convert/BlendedGroups.h"
 #include "tools/convert/Canvas.h"
 #include "tools/convert/ConvertOptions.h"
-#include "tools/convert/GlyphOutlines.h"
 #include "tools/convert/ImageWriter.h"
 #include "tools/convert/Layers.h"
-#include "tools/convert/OutlineText.h"
 #include "tools/convert/PageReport.h"
 #include "tools/convert/PaintColors.h"
+#include "tools/convert/PathPainter.h"
 #include "tools/convert/ShadingWriter.h"
-#include "tools/convert/TextFont.h"
-#include "tools/convert/TextWriter.h"
+#include "tools/convert/TextPainter.h"
 
 #include <mupdf/fitz.h>
 
@@ -22,9 +20,9 @@
 
 namespace DrawmereConvert {
 
-/// One page on its way into the open document. Its operations are the callbacks of a device of
-/// MuPDF; matrices and areas are in the document's coordinates. They throw; `PageDevice` keeps that
-/// from MuPDF.
+/// One page on its way into the open document. Its operations, with those of `paths` and `texts`,
+/// are the callbacks of a device of MuPDF; matrices and areas are in the document's coordinates.
+/// They throw; `PageDevice` keeps that from MuPDF.
 class PagePainter {
 public:
     /// Shape: `area`, where the page is in the document; `scanPage` looks ahead at it; `pageRun`
@@ -32,19 +30,6 @@ public:
     PagePainter(fz_context* context, const ConvertOptions& chosen, GlyphOutlines& glyphOutlines,
                 FontBook& fontBook, PageReport& pageReport, Drawmere& drawmere, const fz_rect& area,
                 const std::function<void(GroupScan&)>& scanPage, const PageRun& pageRun);
-
-    void fillPath(const fz_path* path, bool isEvenOdd, const fz_matrix& matrix, const Paint& paint);
-    void strokePath(const fz_path* path, const fz_stroke_state& style, const fz_matrix& matrix,
-                    const Paint& paint);
-    void clipPath(const fz_path* path, bool isEvenOdd, const fz_matrix& matrix);
-    void clipStrokePath(const fz_path* path, const fz_stroke_state& style, const fz_matrix& matrix);
-
-    void fillText(const fz_text& text, const fz_matrix& matrix, const Paint& paint);
-    void strokeText(const fz_text& text, const fz_stroke_state& style, const fz_matrix& matrix,
-                    const Paint& paint);
-    void ignoreText(const fz_text& text, const fz_matrix& matrix);
-    void clipText(const fz_text& text, const fz_matrix& matrix);
-    void clipStrokeText(const fz_text& text, const fz_stroke_state& style, const fz_matrix& matrix);
 
     void fillShade(fz_shade* shade, const fz_matrix& matrix, float alpha);
     void fillImage(fz_image* image, const fz_matrix& matrix, float alpha);
@@ -80,24 +65,11 @@ public:
 
     Canvas canvas;
     PaintColors colors;
-    fz_device* device = nullptr; ///< that hands on to this object; borrowed
-    std::exception_ptr failure;  ///< what ended the drawing, null as long as all is well
+    PathPainter paths;
+    TextPainter texts;
+    std::exception_ptr failure; ///< what ended the drawing, null as long as all is well
 
 private:
-    /// Notes a path that is too long for some viewers.
-    void noteLength(std::size_t points);
-    /// Splits `matrix` between the document and `current`, which is cleared.
-    StrokeMatrices startStroke(const fz_matrix& matrix);
-    void stroke(const fz_stroke_state& style, const StrokeMatrices& matrices, const Paint& paint);
-    /// Writes what the mode of text lets be text. Returns: false for a span that is to be drawn.
-    bool writeSpan(const fz_text_span& span, const fz_matrix& matrix, const TextPaint& paint);
-    void writeEntered(const TextSpan& text, const TextPaint& paint);
-    void writeText(const fz_text& text, const fz_matrix& matrix, const TextPaint& paint);
-    void readSpan(const fz_text_span& span, const fz_matrix& matrix, const Paint& paint,
-                  std::vector<DrawnGlyph>& drawn);
-    void fillRun(const Paint& paint);
-    void drawGlyphs(const std::vector<DrawnGlyph>& glyphs, const fz_matrix& matrix,
-                    const Paint& paint);
     /// Puts the outline of a small mask into `current`. Returns: false for one that has none.
     bool traceMask(fz_image* image, const fz_matrix& matrix);
     /// Draws a group with a blend mode as a picture. Returns: false for one to be drawn otherwise.
@@ -113,9 +85,6 @@ private:
     fz_context* ctx;
     PageReport& report;
     const ConvertOptions& options;
-    GlyphOutlines& outlines;
-    FontBook& fonts;
-    TextWriter texts;
     ImageWriter images;
     ShadingWriter shadings;
     Layers layers;
@@ -126,7 +95,6 @@ private:
     int skippedGroups = 0; // open, of which the outermost is drawn as a picture
     std::vector<OpenGroup> groups;
     PathData current; // kept for its memory
-    GlyphRun run;     // likewise
 };
 
 } // namespace DrawmereConvert
