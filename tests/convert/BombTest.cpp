@@ -172,22 +172,20 @@ TEST(BrokenParts, AnImageThatCannotBeReadIsSaid) {
 
 TEST(BrokenParts, AFontThatCannotBeReadIsReplaced) {
     for (const TEXTMODE mode : {TEXTMODE_OUTLINES, TEXTMODE_FONTS, TEXTMODE_PLAIN}) {
-        ConvertOptions options;
-        options.textMode = mode;
         const DrawnPage page(
             {"BT /F 20 Tf 10 40 Td (Hello) Tj ET",
              "/Font<</F<</Type/Font/Subtype/TrueType/BaseFont/Broken/Encoding/WinAnsiEncoding"
              "/FirstChar 72/LastChar 72/Widths[500]/FontDescriptor<</Type/FontDescriptor"
              "/FontName/Broken/Flags 32/FontFile2 5 0 R>>>>>>",
              {{"", "nonsense"}}},
-            options);
+            withText(mode));
         EXPECT_EQ(page.count("path") + static_cast<int>(page.texts().size()), 1);
     }
 }
 
 int countLimits(const std::string& content, const ConvertOptions& options) {
     const DrawnPage page({content, ""}, options);
-    return page.report.approximations.at(APPROXIMATION_LIMIT);
+    return page.countNotes(APPROXIMATION_LIMIT);
 }
 
 TEST(ViewersLimits, AnEndlessPathIsReported) {

@@ -12,10 +12,6 @@ using testing::Not;
 
 const std::string halfClear = "/ExtGState<</G<</ca 0.5/CA 0.5>>>>";
 
-int countKnockouts(const DrawnPage& page) {
-    return page.report.approximations.at(APPROXIMATION_KNOCKOUT);
-}
-
 TEST(Canvas, AFillAndAStrokeOfOnePathAreOneElement) {
     const DrawnPage page({"1 0 0 rg 0 0 1 RG 2 w 10 10 m 60 10 l 35 40 l b", ""});
     EXPECT_EQ(page.count("path"), 1);
@@ -83,7 +79,7 @@ TEST(Canvas, AClearShapeWithAnOutlineIsKnockedOutExactly) {
     const DrawnPage page({"/G gs 1 0 0 rg 6 w 10 10 m 60 10 l 35 40 l b", halfClear});
     EXPECT_THAT(page.body(), HasSubstr(" opacity=\"0.502\""));
     EXPECT_THAT(page.body(), Not(HasSubstr("fill-opacity")));
-    EXPECT_EQ(countKnockouts(page), 0);
+    EXPECT_EQ(page.countNotes(APPROXIMATION_KNOCKOUT), 0);
 }
 
 TEST(Canvas, AnOutlineOfAnotherOpacityMasksTheFillUnderIt) {
@@ -91,7 +87,7 @@ TEST(Canvas, AnOutlineOfAnotherOpacityMasksTheFillUnderIt) {
         {"/G gs 1 0 0 rg 6 w 10 10 m 60 10 l 35 40 l b", "/ExtGState<</G<</ca 0.5/CA 0.25>>>>"});
     EXPECT_EQ(page.count("mask"), 1);
     EXPECT_EQ(page.count("path"), 3); // the outline in the mask, the fill, the outline
-    EXPECT_EQ(countKnockouts(page), 0);
+    EXPECT_EQ(page.countNotes(APPROXIMATION_KNOCKOUT), 0);
 }
 
 } // namespace

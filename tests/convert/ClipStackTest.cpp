@@ -73,7 +73,7 @@ TEST(ClipStack, ElementsDontNestDeeperThanAllowed) {
     const DrawnPage page({content + "0 0 200 100 re f", ""}, options);
     EXPECT_LE(page.depth(), 20);
     EXPECT_GT(page.depth(), 10);
-    EXPECT_EQ(page.report.approximations.at(APPROXIMATION_DEPTH), 1);
+    EXPECT_EQ(page.countNotes(APPROXIMATION_DEPTH), 1);
 }
 
 const PageSource triangleClip = {"10 10 m 60 10 l 35 40 l W n 0 0 100 50 re f", ""};
@@ -83,7 +83,7 @@ TEST(ClipStack, BasicClipsByTheRectangleAroundAPath) {
     EXPECT_EQ(page.count("clipPath"), 1);
     EXPECT_EQ(page.attribute("rect", "x"), "10");
     EXPECT_EQ(page.attribute("rect", "width"), "50");
-    EXPECT_EQ(page.report.approximations.at(APPROXIMATION_CLIP), 1);
+    EXPECT_EQ(page.countNotes(APPROXIMATION_CLIP), 1);
 }
 
 TEST(ClipStack, TinyCutsRectanglesAndNothingElse) {
@@ -95,7 +95,7 @@ TEST(ClipStack, TinyCutsRectanglesAndNothingElse) {
                           SVGConfig::SVGTYPE_TINY);
     EXPECT_EQ(other.count("clipPath"), 0);
     EXPECT_EQ(other.count("path"), 1);
-    EXPECT_EQ(other.report.approximations.at(APPROXIMATION_CLIP), 1);
+    EXPECT_EQ(other.countNotes(APPROXIMATION_CLIP), 1);
 }
 
 } // namespace

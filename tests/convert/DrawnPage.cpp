@@ -56,6 +56,23 @@ std::string writePdf(const PageSource& source) {
 
 } // namespace
 
+std::string makeNobodysFont(int width) {
+    std::string widths;
+    for (int code = ' '; code < 127; ++code) {
+        widths += std::to_string(width) + " ";
+    }
+    return "/Font<</F<</Type/Font/Subtype/TrueType/BaseFont/Nobodys/Encoding/WinAnsiEncoding"
+           "/FirstChar 32/LastChar 126/Widths[" +
+           widths +
+           "]/FontDescriptor<</Type/FontDescriptor/FontName/Nobodys/Flags 32/StemV 80>>>>>>";
+}
+
+DrawmereConvert::ConvertOptions withText(DrawmereConvert::TEXTMODE mode) {
+    DrawmereConvert::ConvertOptions options;
+    options.textMode = mode;
+    return options;
+}
+
 DrawnPage::DrawnPage(const PageSource& source, const ConvertOptions& options,
                      SVGConfig::SVGTYPE profile) {
     const TempDir directory;
@@ -130,6 +147,10 @@ std::string DrawnPage::body() const {
     const std::string anchor = "<text id=\"p1\"/></g>";
     const std::size_t place = svg.find(anchor);
     return place == std::string::npos ? svg : svg.substr(place + anchor.size());
+}
+
+int DrawnPage::countNotes(DrawmereConvert::APPROXIMATION kind) const {
+    return report.approximations.at(kind);
 }
 
 } // namespace DrawmereTest

@@ -20,6 +20,13 @@ struct PageSource {
     std::vector<std::pair<std::string, std::string>> objects{};
 };
 
+/// Returns: resources with a font F that is on no machine.
+/// Units: `width` of each of its glyphs, in thousandths of the size.
+std::string makeNobodysFont(int width);
+
+/// Returns: the options that are usual but for the mode of text.
+DrawmereConvert::ConvertOptions withText(DrawmereConvert::TEXTMODE mode);
+
 /// Draws a page into memory, with the library's defaults but three decimals.
 class DrawnPage {
 public:
@@ -46,6 +53,9 @@ public:
 
     /// Returns: what follows the root's tag and what its first group, the page's anchor, holds.
     std::string body() const;
+
+    /// Returns: how often the report notes what is drawn otherwise.
+    int countNotes(DrawmereConvert::APPROXIMATION kind) const;
 
     std::string svg;
     DrawmereConvert::PageReport report;

@@ -7,6 +7,11 @@
 namespace DrawmereTest {
 namespace {
 
+using DrawmereConvert::APPROXIMATION_BLEND;
+using DrawmereConvert::APPROXIMATION_MASK;
+using DrawmereConvert::APPROXIMATION_MIXTURE;
+using DrawmereConvert::APPROXIMATION_OVERPRINT;
+using DrawmereConvert::APPROXIMATION_PATTERN;
 using DrawmereNS::SVGConfig;
 using testing::HasSubstr;
 using testing::Not;
@@ -90,11 +95,11 @@ TEST(Layers, WithoutPatternsAndMasksWhatTheyPaintIsLeftOutAndCounted) {
            "1 0 0 rg 0 0 5 5 re f"}}},
         {}, SVGConfig::SVGTYPE_PLAZMIC);
     EXPECT_EQ(tiled.count("rect"), 0);
-    EXPECT_EQ(tiled.report.approximations.at(DrawmereConvert::APPROXIMATION_PATTERN), 1);
+    EXPECT_EQ(tiled.countNotes(APPROXIMATION_PATTERN), 1);
     const DrawnPage masked(makeMasked("0 0 99 99 re f", "10 10 50 50 re f"), {},
                            SVGConfig::SVGTYPE_TINY);
     EXPECT_EQ(masked.count("rect"), 1);
-    EXPECT_EQ(masked.report.approximations.at(DrawmereConvert::APPROXIMATION_MASK), 1);
+    EXPECT_EQ(masked.countNotes(APPROXIMATION_MASK), 1);
 }
 
 TEST(Layers, APatternWhoseCellsOverlapIsCounted) {
@@ -103,7 +108,7 @@ TEST(Layers, APatternWhoseCellsOverlapIsCounted) {
          "/Pattern<</P 5 0 R>>",
          {{"/PatternType 1/PaintType 1/TilingType 1/BBox[0 0 20 20]/XStep 10/YStep 10/Resources<<>>",
            "1 0 0 rg 0 0 15 15 re f"}}});
-    EXPECT_EQ(page.report.approximations.at(DrawmereConvert::APPROXIMATION_PATTERN), 1);
+    EXPECT_EQ(page.countNotes(APPROXIMATION_PATTERN), 1);
 }
 
 TEST(Layers, AMaskEndsWithWhatItMasks) {
@@ -128,15 +133,11 @@ PageSource makeBlended(const std::string& mode, const std::string& backdrop) {
     return {backdrop + " /G gs 0 1 0 rg 10 10 50 50 re f", "/ExtGState<</G<</BM/" + mode + ">>>>"};
 }
 
-int countBlended(const DrawnPage& page) {
-    return page.report.approximations.at(DrawmereConvert::APPROXIMATION_MIXTURE);
-}
-
 TEST(Layers, AMixtureOfColoursIsAPicture) {
     const DrawnPage page(makeBlended("Multiply", "1 0 0 rg 30 30 100 50 re f"));
     EXPECT_EQ(page.count("image"), 1);
     EXPECT_EQ(page.count("rect"), 1);
-    EXPECT_EQ(countBlended(page), 1);
+    EXPECT_EQ(page.countNotes(APPROXIMATION_MIXTURE), 1);
     EXPECT_EQ(page.report.countApproximations(), 1);
 }
 
@@ -158,10 +159,8 @@ TEST(Layers, TextInAPictureCanBeSearchedFor) {
     PageSource source = makeBlended("Multiply", "1 0 0 rg 30 30 100 50 re f");
     source.content += " BT /T 20 Tf 40 40 Td (Hello) Tj ET";
     source.resources += "/Font<</T<</Type/Font/Subtype/Type1/BaseFont/Helvetica>>>>";
-    DrawmereConvert::ConvertOptions options;
-    options.textMode = DrawmereConvert::TEXTMODE_PLAIN;
-    const DrawnPage page(source, options);
-    EXPECT_EQ(countBlended(page), 2);
+    const DrawnPage page(source, withText(DrawmereConvert::TEXTMODE_PLAIN));
+    EXPECT_EQ(page.countNotes(APPROXIMATION_MIXTURE), 2);
     EXPECT_THAT(page.body(), HasSubstr("Hello"));
     EXPECT_THAT(page.body(), HasSubstr("fill=\"none\""));
 }
@@ -172,13 +171,13 @@ TEST(Layers, BlendModesInAPatternAreCounted) {
                           {{"/PatternType 1/PaintType 1/TilingType 1/BBox[0 0 9 9]/XStep 9/YStep 9"
                             "/Resources<</ExtGState<</G<</BM/Multiply>>>>>>",
                             "/G gs 1 0 0 rg 0 0 5 5 re f"}}});
-    EXPECT_EQ(page.report.approximations.at(DrawmereConvert::APPROXIMATION_BLEND), 1);
+    EXPECT_EQ(page.countNotes(APPROXIMATION_BLEND), 1);
     EXPECT_EQ(page.count("image"), 0);
 }
 
 TEST(Layers, OverprintIsCountedOnceAPage) {
     const DrawnPage page({"/O gs 9 9 9 9 re f 29 9 9 9 re f", "/ExtGState<</O<</OP true>>>>"});
-    EXPECT_EQ(page.report.approximations.at(DrawmereConvert::APPROXIMATION_OVERPRINT), 1);
+    EXPECT_EQ(page.countNotes(APPROXIMATION_OVERPRINT), 1);
     EXPECT_EQ(page.report.countApproximations(), 1);
 }
 

@@ -60,7 +60,7 @@ TEST(ShadingWriter, CirclesBesideEachOtherAreAnImage) {
         {"/S sh", makeShading("3", "/Coords[50 50 10 150 50 20]/Extend[false false]")});
     EXPECT_EQ(page.count("radialGradient"), 0);
     EXPECT_EQ(page.count("image"), 1);
-    EXPECT_EQ(page.report.approximations.at(APPROXIMATION_SHADING), 1);
+    EXPECT_EQ(page.countNotes(APPROXIMATION_SHADING), 1);
 }
 
 TEST(ShadingWriter, AMeshIsAnImageOfTheChosenResolution) {
@@ -72,14 +72,14 @@ TEST(ShadingWriter, AMeshIsAnImageOfTheChosenResolution) {
     const DrawnPage fine(path, 0, options);
     EXPECT_EQ(coarse.count("image"), 1);
     EXPECT_GT(fine.svg.size(), 2 * coarse.svg.size());
-    EXPECT_EQ(fine.report.approximations.at(APPROXIMATION_SHADING), 1);
+    EXPECT_EQ(fine.countNotes(APPROXIMATION_SHADING), 1);
 }
 
 TEST(ShadingWriter, WithoutGradientsAShadingHasTheColourBetweenItsEnds) {
     const DrawnPage page({"/S sh", makeShading("2", "/Coords[0 0 200 0]/Extend[true true]")}, {},
                          DrawmereNS::SVGConfig::SVGTYPE_TINY);
     EXPECT_EQ(page.attribute("rect", "fill"), "#7f007f");
-    EXPECT_EQ(page.report.approximations.at(DrawmereConvert::APPROXIMATION_GRADIENT), 1);
+    EXPECT_EQ(page.countNotes(DrawmereConvert::APPROXIMATION_GRADIENT), 1);
 }
 
 TEST(ShadingWriter, AStrokeWithAShadingIsStrokedWithIt) {

@@ -21,9 +21,7 @@ const std::string helvetica =
     "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica/Encoding/WinAnsiEncoding>>>>";
 
 DrawnPage drawText(const std::string& operators, TEXTMODE mode) {
-    ConvertOptions options;
-    options.textMode = mode;
-    return DrawnPage({"BT /F 20 Tf 10 40 Td " + operators + " ET", helvetica}, options);
+    return DrawnPage({"BT /F 20 Tf 10 40 Td " + operators + " ET", helvetica}, withText(mode));
 }
 
 /// Returns: the tag of the first text.
@@ -168,9 +166,8 @@ TEST(TextWriter, TurnedTextHasAMatrix) {
 
 TEST(TextWriter, OutlinesThatOverlapFillByTheirOwnRule) {
     EXPECT_EQ(findText(drawText("(o) Tj", TEXTMODE_FONTS)), "<text x=\"10\" y=\"60\">");
-    ConvertOptions options;
-    options.textMode = TEXTMODE_FONTS;
-    const DrawnPage page(Conversion::document("corruptionOneByteMissing.pdf"), 0, options);
+    const DrawnPage page(Conversion::document("corruptionOneByteMissing.pdf"), 0,
+                         withText(TEXTMODE_FONTS));
     EXPECT_THAT(page.svg, HasSubstr("fill-rule=\"nonzero\">"));
 }
 
@@ -194,10 +191,8 @@ TEST(TextWriter, WordsThatAreNotKeepTheirPositions) {
 }
 
 TEST(TextWriter, AProfileWithoutWordSpacingGetsPositions) {
-    ConvertOptions options;
-    options.textMode = TEXTMODE_FONTS;
-    const DrawnPage page({"BT /F 20 Tf 10 40 Td [(an) -500 (old)] TJ ET", helvetica}, options,
-                         DrawmereNS::SVGConfig::SVGTYPE_TINY);
+    const DrawnPage page({"BT /F 20 Tf 10 40 Td [(an) -500 (old)] TJ ET", helvetica},
+                         withText(TEXTMODE_FONTS), DrawmereNS::SVGConfig::SVGTYPE_TINY);
     EXPECT_EQ(page.texts(), std::vector<std::string>{"an old"});
     EXPECT_EQ(findText(page), "<text x=\"10 21.12 33 42.24\" y=\"60\">");
 }
@@ -216,16 +211,19 @@ TEST(TextWriter, NoBlankLeadsATextAndNoneFollowsAnother) {
     EXPECT_TRUE(drawText("3 Tr (  ) Tj", TEXTMODE_FONTS).texts().empty());
 }
 
+/// Draws a text with a font of which `map` tells what the codes stand for.
+DrawnPage drawMapped(const std::string& operators, const std::string& map, TEXTMODE mode) {
+    return DrawnPage({"BT /F 20 Tf 10 40 Td " + operators + " ET",
+                      "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica/ToUnicode 5 0 R>>>>",
+                      {{"", "1 begincodespacerange <00> <ff> endcodespacerange\n" + map}}},
+                     withText(mode));
+}
+
 /// Draws a text in which the glyph of A stands for the letters fi.
 DrawnPage drawLigature(const std::string& operators) {
-    ConvertOptions options;
-    options.textMode = TEXTMODE_FONTS;
-    const std::string font =
-        "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica/ToUnicode 5 0 R>>>>";
-    const std::string map = "1 begincodespacerange <00> <ff> endcodespacerange\n"
-                            "1 beginbfchar <41> <00660069> endbfchar\n"
+    const std::string map = "1 beginbfchar <41> <00660069> endbfchar\n"
                             "1 beginbfrange <61> <7a> <0061> endbfrange\n";
-    return DrawnPage({"BT /F 20 Tf 10 40 Td " + operators + " ET", font, {{"", map}}}, options);
+    return drawMapped(operators, map, TEXTMODE_FONTS);
 }
 
 TEST(TextWriter, ALigatureKeepsItsLettersAndThePlaceInItsLine) {
@@ -252,38 +250,22 @@ TEST(TextWriter, ALigatureOfLettersThatWereNotOneIsInAFontOfItsOwn) {
 }
 
 TEST(TextWriter, ABlankThatShowsOrIsPartOfAGlyphIsNeverLeftOut) {
-    ConvertOptions options;
-    options.textMode = TEXTMODE_FONTS;
-    const std::string font =
-        "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica/ToUnicode 5 0 R>>>>";
-    const std::string map = "1 begincodespacerange <00> <ff> endcodespacerange\n"
-                            "2 beginbfchar <41> <0020> <42> <00200066> endbfchar\n";
-    const DrawnPage page({"BT /F 20 Tf 10 40 Td (AA) Tj 0 -20 Td (B) Tj ET", font, {{"", map}}},
-                         options);
+    const std::string map = "2 beginbfchar <41> <0020> <42> <00200066> endbfchar\n";
+    const DrawnPage page = drawMapped("(AA) Tj 0 -20 Td (B) Tj", map, TEXTMODE_FONTS);
     EXPECT_EQ(page.texts(), (std::vector<std::string>{"\u00A0\u00A0", "\u00A0f"}));
 }
 
 TEST(TextWriter, ACharacterBeyondTheFirstPlaneHasOnePosition) {
-    ConvertOptions options;
-    options.textMode = TEXTMODE_PLAIN;
-    const std::string font =
-        "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica/ToUnicode 5 0 R>>>>";
-    const std::string map = "1 begincodespacerange <00> <ff> endcodespacerange\n"
-                            "2 beginbfchar <41> <D835DC00> <42> <0042> endbfchar\n";
-    const DrawnPage page({"BT /F 20 Tf 10 40 Td (ABA) Tj ET", font, {{"", map}}}, options);
+    const std::string map = "2 beginbfchar <41> <D835DC00> <42> <0042> endbfchar\n";
+    const DrawnPage page = drawMapped("(ABA) Tj", map, TEXTMODE_PLAIN);
     EXPECT_EQ(findText(page), "<text x=\"10 23.34 36.68\" y=\"60\">");
 }
 
 /// Draws a text in which nothing is known of the glyph of A, and that of B is a soft hyphen.
 DrawnPage drawUnknown(const std::string& shown, TEXTMODE mode) {
-    ConvertOptions options;
-    options.textMode = mode;
-    const std::string font =
-        "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica/ToUnicode 5 0 R>>>>";
-    const std::string map = "1 begincodespacerange <00> <ff> endcodespacerange\n"
-                            "4 beginbfchar <41> <FFFD> <42> <00AD> <43> <0043> "
+    const std::string map = "4 beginbfchar <41> <FFFD> <42> <00AD> <43> <0043> "
                             "<44> <00680065006C006C006F> endbfchar\n";
-    return DrawnPage({"BT /F 20 Tf 10 40 Td " + shown + " ET", font, {{"", map}}}, options);
+    return drawMapped(shown, map, mode);
 }
 
 TEST(TextWriter, GlyphsWithoutCharactersAreOutlinesUnlessTheirFontIsThere) {
@@ -305,17 +287,9 @@ TEST(TextWriter, AHyphenThatViewersHideIsOneThatTheyShow) {
 
 // Widths that are not those of the font that stands in for it stretch its glyphs.
 TEST(TextWriter, StrokedTextThatCannotBeWrittenIsStrokedAsOutlines) {
-    std::string widths;
-    for (int i = 0; i < 95; ++i) {
-        widths += "350 ";
-    }
-    const std::string font =
-        "/Font<</F<</Type/Font/Subtype/TrueType/BaseFont/Nobodys/Encoding/WinAnsiEncoding"
-        "/FirstChar 32/LastChar 126/Widths[" +
-        widths + "]/FontDescriptor<</Type/FontDescriptor/FontName/Nobodys/Flags 32/StemV 80>>>>>>";
-    ConvertOptions options;
-    options.textMode = TEXTMODE_FONTS;
-    const DrawnPage page({"BT /F 20 Tf 1 Tr 1 0 0 RG 10 40 Td (Hollow) Tj ET", font}, options);
+    const DrawnPage page(
+        {"BT /F 20 Tf 1 Tr 1 0 0 RG 10 40 Td (Hollow) Tj ET", makeNobodysFont(350)},
+        withText(TEXTMODE_FONTS));
     EXPECT_EQ(page.report.countApproximations(), 1);
     EXPECT_EQ(page.attribute("path", "stroke"), "red");
     EXPECT_EQ(page.attribute("path", "fill"), "none");
@@ -339,18 +313,14 @@ TEST(TextWriter, TextThatDoesNotShowIsStillText) {
 }
 
 TEST(TextWriter, TextFromRightToLeftIsInTheOrderOfSpeech) {
-    ConvertOptions options;
-    options.textMode = TEXTMODE_FONTS;
-    const DrawnPage page(Conversion::document("habibi-rotated.pdf"), 0, options);
+    const DrawnPage page(Conversion::document("habibi-rotated.pdf"), 0, withText(TEXTMODE_FONTS));
     EXPECT_THAT(page.svg, HasSubstr("\u062D\u064E\u0628\u064A\u0628\u064A"));
     EXPECT_THAT(page.svg, Not(HasSubstr("direction=\"rtl\"")));
 }
 
 TEST(Type3Outline, BitmapGlyphsBecomePathsInEveryMode) {
     for (const TEXTMODE mode : {TEXTMODE_OUTLINES, TEXTMODE_FONTS, TEXTMODE_PLAIN}) {
-        ConvertOptions options;
-        options.textMode = mode;
-        const DrawnPage page(Conversion::document("french_diacritics.pdf"), 0, options);
+        const DrawnPage page(Conversion::document("french_diacritics.pdf"), 0, withText(mode));
         EXPECT_EQ(page.count("image"), 0);
         EXPECT_GT(page.count("path"), 0);
         EXPECT_EQ(page.report.countApproximations(), 0);

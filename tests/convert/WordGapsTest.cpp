@@ -9,7 +9,6 @@
 namespace DrawmereTest {
 namespace {
 
-using DrawmereConvert::ConvertOptions;
 using DrawmereConvert::TEXTMODE;
 using DrawmereConvert::TEXTMODE_FONTS;
 using DrawmereConvert::TEXTMODE_PLAIN;
@@ -44,11 +43,9 @@ std::u16string separate(const std::u16string& letters, const std::vector<float>&
 
 DrawnPage drawText(const std::string& operators, TEXTMODE mode,
                    const std::string& more = "/Encoding/WinAnsiEncoding") {
-    ConvertOptions options;
-    options.textMode = mode;
     return DrawnPage({"BT /F 20 Tf 10 40 Td " + operators + " ET",
                       "/Font<</F<</Type/Font/Subtype/Type1/BaseFont/Helvetica" + more + ">>>>"},
-                     options);
+                     withText(mode));
 }
 
 std::string textOf(const std::string& operators, TEXTMODE mode = TEXTMODE_PLAIN) {
@@ -57,9 +54,7 @@ std::string textOf(const std::string& operators, TEXTMODE mode = TEXTMODE_PLAIN)
 
 TEST(WordGaps, PhrasesOfATypesetPageHaveTheirBlanks) {
     for (const TEXTMODE mode : {TEXTMODE_PLAIN, TEXTMODE_FONTS}) {
-        ConvertOptions options;
-        options.textMode = mode;
-        const DrawnPage page(Conversion::document("pdflatex-outline.pdf"), 1, options);
+        const DrawnPage page(Conversion::document("pdflatex-outline.pdf"), 1, withText(mode));
         EXPECT_THAT(page.texts(), Contains(StartsWith("Hello, here is some text without a")));
         EXPECT_THAT(page.texts(), Contains("1 Foo"));
         EXPECT_THAT(page.texts(), Each(Not(HasSubstr("  "))));
@@ -136,20 +131,9 @@ TEST(WordGaps, AnAccentIsNoEndOfAWord) {
 
 // What it has is the width of the document, not of the font that stands in for its own.
 TEST(WordGaps, AFontThatStandsInForAWiderOneHasNoGaps) {
-    std::string widths;
-    for (int i = 0; i < 95; ++i) {
-        widths += "900 ";
-    }
-    const std::string more = "/Encoding/WinAnsiEncoding/FirstChar 32/LastChar 126/Widths[" +
-                             widths +
-                             "]/FontDescriptor<</Type/FontDescriptor/FontName/Nobodys/Flags 32"
-                             "/StemV 80>>";
-    ConvertOptions options;
-    options.textMode = TEXTMODE_PLAIN;
-    const DrawnPage page(
-        {"BT /F 20 Tf 10 40 Td [(ill)] TJ -300 0 Td [(till) -300 (it)] TJ ET",
-         "/Font<</F<</Type/Font/Subtype/TrueType/BaseFont/Nobodys" + more + ">>>>"},
-        options);
+    const DrawnPage page({"BT /F 20 Tf 10 40 Td [(ill)] TJ -300 0 Td [(till) -300 (it)] TJ ET",
+                          makeNobodysFont(900)},
+                         withText(TEXTMODE_PLAIN));
     EXPECT_EQ(page.texts(), (std::vector<std::string>{"ill till it"}));
 }
 

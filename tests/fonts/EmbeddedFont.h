@@ -2,6 +2,7 @@
 #pragma once
 
 #include "SVGFont.h"
+#include "fonts/SVGEmbFont.h"
 #include "fonts/SVGEmbTLString.h"
 #include "foundation/fontservice/FS_ExtraFonts.h"
 #include "foundation/records/TLStringWithGlyphInfo.h"
@@ -9,6 +10,7 @@
 
 #include <filesystem>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace DrawmereTest {
@@ -20,20 +22,25 @@ using MoxFontService_NS::FS_ExtraFonts;
 using TalFont::TLGlyphEntry;
 using TalFont::TLStringWithGlyphInfo;
 
+constexpr std::uint16_t noGlyph = TLGlyphEntry::noGlyph;
+
 // The fonts by the names that the tests give them.
 constexpr const char16_t* uprightFace = u"Upright Test"; ///< with forms for vertical text
 constexpr const char16_t* hanFace = u"Han Test";         ///< with outlines of cubic curves
 constexpr const char16_t* arabicFace = u"Arabic Test";   ///< with outlines of quadratic curves
 constexpr const char16_t* latinFace = u"Latin Test";     ///< with ligatures
 
+/// Returns: the path of a file in tests/data/fonts.
+inline UnicodeString fontPath(const char* file) {
+    return UnicodeString::fromUTF8(std::string(TEST_SOURCE_DIR "/data/fonts/") + file);
+}
+
 /// Returns: those fonts, for the calls that take a font.
 inline FS_ExtraFonts& testFonts() {
     static FS_ExtraFonts fonts = [] {
-        constexpr const char* folder = TEST_SOURCE_DIR "/data/fonts/";
         FS_ExtraFonts made;
         const auto add = [&made](const char16_t* name, const char* file) {
-            const std::string path = std::string(folder) + file;
-            made.addFile(UnicodeString::fromUTF8(path), {.names = {name}});
+            made.addFile(fontPath(file), {.names = {name}});
         };
         add(uprightFace, "TestVRTR-TTF-Regular.ttf");
         add(hanFace, "SourceHanSans-subset-vert.otf");
@@ -51,6 +58,13 @@ inline SVGFont makeFont(const UnicodeString& name, bool byGlyphs,
     font.setFontAttribute(name, MoxLength::fromRaw(10.0F), weight, style, u"", false);
     font.setEmbedAttribute(true, byGlyphs);
     return font;
+}
+
+/// Has `font` take up a text by the glyphs it was shaped into.
+inline void embedGlyphs(SVGEmbFont& font, const UnicodeString& text,
+                        std::vector<TLGlyphEntry> entries, bool wholeRun, bool vertical) {
+    const TLStringWithGlyphInfo glyphs(std::move(entries));
+    font.embedGlyphId(text, &glyphs, wholeRun, vertical);
 }
 
 /// Returns: the entries of a map in its order, as "fi=7 8, x=4".

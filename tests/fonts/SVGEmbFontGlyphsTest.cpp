@@ -23,8 +23,7 @@ struct FontTree {
 
     void embed(const UnicodeString& text, std::vector<TLGlyphEntry> entries, bool vertical = false,
                bool wholeRun = false) {
-        const TLStringWithGlyphInfo glyphs(std::move(entries));
-        font.embedGlyphId(text, &glyphs, wholeRun, vertical);
+        embedGlyphs(font, text, std::move(entries), wholeRun, vertical);
     }
 
     std::string xml(const MoxNode* node) const { return toXml(*tree.document, node); }
@@ -245,7 +244,7 @@ TEST(SVGEmbFontElement, WritesBoldAndItalicAsWordsAndOtherWeightsAsNumbers) {
         {700, MoxFontService_NS::FSSLANT_ITALIC, R"(font-weight="bold" font-style="italic")"},
         {600, MoxFontService_NS::FSSLANT_UPRIGHT, R"(font-weight="600" font-style="normal")"},
     };
-    const UnicodeString path(TEST_SOURCE_DIR "/data/fonts/le-murmure.otf");
+    const UnicodeString path = fontPath("le-murmure.otf");
     for (const Row& row : rows) {
         FS_ExtraFonts fonts;
         fonts.addFile(path, {.names = {u"Styled"}, .weight = row.weight, .slant = row.slant});
@@ -273,7 +272,7 @@ TEST(SVGEmbFontElement, WithoutTextIsTakenOutAgain) {
 TEST(SVGEmbFontElement, ATextWithAGlyphThatCanNotBeReadHasNoElement) {
     FontTree tree(uprightFace);
     tree.embed(u"ab", {{1, 2}, {0, 60000}, {1, 3}});
-    tree.embed(u"c", {{1, TLGlyphEntry::noGlyph}});
+    tree.embed(u"c", {{1, noGlyph}});
     EXPECT_EQ(tree.written(), std::string(uprightStart) +
                                   R"(<glyph unicode="b" d="~" horiz-adv-x="500"/>
 </font>)");
@@ -302,7 +301,7 @@ TEST(SVGEmbFontElement, OfNoFaceStaysWithoutGlyphsWhenThereIsText) {
 TEST(SVGEmbFontElement, AWholeRunWithoutGlyphsIsAnEmptyGlyph) {
     FontTree tree(uprightFace);
     tree.embed(u"X", {{1, 2}});
-    tree.embed(u"run", {{3, TLGlyphEntry::noGlyph}}, false, /*wholeRun=*/true);
+    tree.embed(u"run", {{3, noGlyph}}, false, /*wholeRun=*/true);
     EXPECT_NE(tree.written().find(R"(<glyph unicode="run" d="" horiz-adv-x="0"/>)"),
               std::string::npos);
 }

@@ -17,7 +17,7 @@ public:
     void embedText(const UnicodeString& text, bool isVertical) {
         for (std::int32_t i = 0; i < text.length(); i = text.moveIndex32(i, 1)) {
             const std::uint16_t glyph = face.getGlyphID(text.char32At(i), false);
-            if (glyph == TLGlyphEntry::noGlyph) {
+            if (glyph == noGlyph) {
                 continue;
             }
             const std::uint16_t standing = face.getGlyphID(text.char32At(i), true);
@@ -109,9 +109,8 @@ void embed(SVGEmbFont& font, PlainMaps& maps, Chance& chance) {
         return;
     }
     const std::vector<TLGlyphEntry> entries = chance.makeEntries();
-    const TLStringWithGlyphInfo glyphs(entries);
     const bool wholeRun = chance.oneIn(3);
-    font.embedGlyphId(text, &glyphs, wholeRun, vertical);
+    embedGlyphs(font, text, entries, wholeRun, vertical);
     if (wholeRun) {
         maps.embedRun(text, entries, vertical);
     } else {

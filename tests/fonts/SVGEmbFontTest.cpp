@@ -11,16 +11,13 @@
 namespace DrawmereTest {
 namespace {
 
-constexpr std::uint16_t noGlyph = TLGlyphEntry::noGlyph;
-
 /// A font of the tests, opened.
 struct OpenFont : SVGEmbFont {
     explicit OpenFont(const char16_t* name) : SVGEmbFont(makeFont(name, false), &testFonts()) {}
 
     void embed(const UnicodeString& text, std::vector<TLGlyphEntry> entries, bool wholeRun = false,
                bool vertical = false) {
-        const TLStringWithGlyphInfo glyphs(std::move(entries));
-        embedGlyphId(text, &glyphs, wholeRun, vertical);
+        embedGlyphs(*this, text, std::move(entries), wholeRun, vertical);
     }
 };
 
@@ -102,7 +99,7 @@ TEST(SVGEmbFont, FontsOfOtherNamesAreNotTheSame) {
 
 TEST(SVGEmbFont, FacesOfOneFamilyDifferByWeightAndBySlant) {
     FS_ExtraFonts family;
-    const UnicodeString path(TEST_SOURCE_DIR "/data/fonts/le-murmure.otf");
+    const UnicodeString path = fontPath("le-murmure.otf");
     const auto add = [&](int weight, MoxFontService_NS::FSSLANT slant) {
         family.addFile(path, {.names = {u"Family"}, .weight = weight, .slant = slant});
     };
@@ -125,7 +122,7 @@ TEST(SVGEmbFont, TheStretchChoosesTheWidthOfTheFace) {
         FONTSTRECH_EXPANDED,       FONTSTRECH_EXTRAEXPANDED,  FONTSTRECH_ULTRAEXPANDED,
     };
     FS_ExtraFonts family;
-    const UnicodeString path(TEST_SOURCE_DIR "/data/fonts/le-murmure.otf");
+    const UnicodeString path = fontPath("le-murmure.otf");
     for (int width = 1; width <= 9; ++width) {
         family.addFile(path, {.names = {u"Family"}, .widthClass = width});
     }
