@@ -1,10 +1,14 @@
 #include "SVGConfig.h"
 
+#include "foundation/common/MoxNameTable.h"
 #include "foundation/records/TLGraphicImage.h"
+#include "tests/support/Utf8.h"
 
 #include <gtest/gtest.h>
 
 using namespace DrawmereNS;
+using DrawmereTest::utf8;
+using MoxCommonNS::MoxNameTable;
 
 namespace {
 
@@ -84,4 +88,55 @@ TEST(SVGConfigImages, NullImageIsOneWithoutAFile) {
         EXPECT_TRUE(config.isEmbedImage(nullptr)) << processing;
         EXPECT_FALSE(config.isCopyImage(nullptr)) << processing;
     }
+}
+
+TEST(SVGConfigImages, ImageProcessingIsSetByItsKeyword) {
+    struct Row {
+        const char16_t* keyword;
+        int number;
+    };
+
+    constexpr Row rows[] = {
+        {u"embed-all", 0}, {u"link", 1}, {u"copy-all", 2}, {u"copy", 3},
+        {u"Embed-All", 0}, {u"Copy", 0}, {u"copy ", 0},    {u"nonsense", 0},
+    };
+    for (const Row& row : rows) {
+        SVGConfig config;
+        config.imageProcessing = 9;
+        config.setImageProcessingType(MoxName(row.keyword));
+        EXPECT_EQ(config.imageProcessing, row.number) << utf8(row.keyword);
+        EXPECT_EQ(utf8(MoxNameTable::getSharedNameString(config.imageProcessingName)),
+                  utf8(row.keyword));
+    }
+}
+
+TEST(SVGConfigImages, ImageConversionIsSetByItsKeyword) {
+    struct Row {
+        const char16_t* keyword;
+        int number;
+    };
+
+    constexpr Row rows[] = {
+        {u"auto", 0},    {u"jpeg", 1},    {u"jpg", 1}, {u"png", 2},      {u"jpg-all", 3},
+        {u"png-all", 4}, {u"JPG-ALL", 0}, {u"gif", 0}, {u"jpeg-all", 0},
+    };
+    for (const Row& row : rows) {
+        SVGConfig config;
+        config.imageConversion = 9;
+        config.setImageConversion(MoxName(row.keyword));
+        EXPECT_EQ(config.imageConversion, row.number) << utf8(row.keyword);
+        EXPECT_EQ(utf8(MoxNameTable::getSharedNameString(config.imageConversionName)),
+                  utf8(row.keyword));
+    }
+}
+
+TEST(SVGConfigImages, NoNameReadsAsTheFirstKeyword) {
+    SVGConfig config;
+    config.setImageConversion(MoxName(u"png"));
+    config.setImageConversion(MoxName());
+    config.setImageProcessingType(MoxName(u"copy"));
+    config.setImageProcessingType(MoxName());
+    EXPECT_EQ(config.imageConversion, 0);
+    EXPECT_EQ(config.imageProcessing, 0);
+    EXPECT_EQ(config.imageProcessingName, MoxName());
 }

@@ -27,8 +27,6 @@ public:
 
 std::string textOf(MoxName name) { return utf8(MoxNameTable::getSharedNameString(name)); }
 
-MoxName name(const UnicodeString& text) { return MoxName(text); }
-
 std::string embedFonts(const UnicodeString& list) {
     SVGConfig config;
     config.setEmbedFonts(list);
@@ -115,8 +113,8 @@ void changeEverything(SVGConfig& config) {
     }
     config.svgType = SVGConfig::SVGTYPE_PLAZMIC;
     config.maxLength = 7.0F;
-    config.setImageConversion(name(u"png"));
-    config.setImageProcessingType(name(u"copy"));
+    config.setImageConversion(MoxName(u"png"));
+    config.setImageProcessingType(MoxName(u"copy"));
     config.setEmbedFonts(u"A");
     config.enterImageName(u"source", u"key", u"entered");
 }
@@ -214,55 +212,6 @@ TEST(SVGConfig, ProfilesHaveTheNumbersOfTheCallers) {
     EXPECT_EQ(static_cast<int>(SVGConfig::SVGTYPE_PLAZMIC), 4);
 }
 
-TEST(SVGConfig, ImageProcessingIsSetByItsKeyword) {
-    struct Row {
-        const char16_t* keyword;
-        int number;
-    };
-
-    constexpr Row rows[] = {
-        {u"embed-all", 0}, {u"link", 1}, {u"copy-all", 2}, {u"copy", 3},
-        {u"Embed-All", 0}, {u"Copy", 0}, {u"copy ", 0},    {u"nonsense", 0},
-    };
-    for (const Row& row : rows) {
-        SVGConfig config;
-        config.imageProcessing = 9;
-        config.setImageProcessingType(name(row.keyword));
-        EXPECT_EQ(config.imageProcessing, row.number) << utf8(row.keyword);
-        EXPECT_EQ(textOf(config.imageProcessingName), utf8(row.keyword));
-    }
-}
-
-TEST(SVGConfig, ImageConversionIsSetByItsKeyword) {
-    struct Row {
-        const char16_t* keyword;
-        int number;
-    };
-
-    constexpr Row rows[] = {
-        {u"auto", 0},    {u"jpeg", 1},    {u"jpg", 1}, {u"png", 2},      {u"jpg-all", 3},
-        {u"png-all", 4}, {u"JPG-ALL", 0}, {u"gif", 0}, {u"jpeg-all", 0},
-    };
-    for (const Row& row : rows) {
-        SVGConfig config;
-        config.imageConversion = 9;
-        config.setImageConversion(name(row.keyword));
-        EXPECT_EQ(config.imageConversion, row.number) << utf8(row.keyword);
-        EXPECT_EQ(textOf(config.imageConversionName), utf8(row.keyword));
-    }
-}
-
-TEST(SVGConfig, NoNameReadsAsTheFirstKeyword) {
-    SVGConfig config;
-    config.setImageConversion(name(u"png"));
-    config.setImageConversion(MoxName());
-    config.setImageProcessingType(name(u"copy"));
-    config.setImageProcessingType(MoxName());
-    EXPECT_EQ(config.imageConversion, 0);
-    EXPECT_EQ(config.imageProcessing, 0);
-    EXPECT_EQ(config.imageProcessingName, MoxName());
-}
-
 // On purpose: the name loses the character before its comma, which the caller supplies as a blank.
 TEST(SVGConfig, FontNameLosesTheCharacterBeforeItsComma) {
     EXPECT_EQ(embedFonts(u"Arial,Times"), "<Aria><Times>");
@@ -338,7 +287,7 @@ TEST(SVGConfig, LengthThatIsNotPositiveBecomesTheLimit) {
 
 TEST(SVGConfig, SmallDeviceModeOverrulesTheImageConversion) {
     SVGConfig config;
-    config.setImageConversion(name(u"png"));
+    config.setImageConversion(MoxName(u"png"));
     config.adjustConfig();
     EXPECT_EQ(config.imageConversion, 2);
     config.wispMode = true;

@@ -1,22 +1,13 @@
 // One walk does what the passes do one after the other.
 #include "post/QuilletExtention.h"
 
+#include "tests/post/Quillet.h"
 #include "tests/post/ReadTree.h"
 
 #include <random>
 
 namespace DrawmereTest {
 namespace {
-
-QuilletExtention makeQuillet() {
-    QuilletExtention quillet;
-    for (const char* element :
-         {"circle", "ellipse", "line", "path", "polygon", "polyline", "rect", "text"}) {
-        quillet.paintableElements.insert(toName(element));
-    }
-    quillet.paintAttributes = {toName("fill"), toName("stroke")};
-    return quillet;
-}
 
 /// Writes trees that hold all the passes look for, at all depths, the same for each number.
 class TreeMaker {

@@ -2,9 +2,9 @@
 
 #include "draw/DrawmereImpl.h"
 #include "foundation/common/MoxUtil.h"
-#include "foundation/records/TLMemoryImage.h"
 #include "foundation/records/TLStringWithGlyphInfo.h"
 #include "tests/fonts/EmbeddedFont.h"
+#include "tests/support/AnyImage.h"
 #include "tests/support/TinyImages.h"
 #include "tree/SVGTreeManager.h"
 
@@ -39,18 +39,6 @@ template <typename... Args> struct With {
     template <typename Result> static constexpr auto of(Result (Drawmere::*member)(Args...)) {
         return member;
     }
-};
-
-/// An image of a type that its bytes don't tell.
-class AnyImage : public TalGraphic::TLMemoryImage {
-public:
-    AnyImage(TLGraphicType imageType, std::string_view bytes, const UnicodeString& name)
-        : TLMemoryImage(bytes, name), type(imageType) {}
-
-    TLGraphicType getGraphicType() override { return type; }
-
-private:
-    TLGraphicType type;
 };
 
 /// Draws a small file, sometimes a damaged one and mostly by a name that was drawn before.
