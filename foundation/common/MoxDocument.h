@@ -17,6 +17,15 @@ public:
     /// Nodes that outlive the document belong to no document afterwards.
     ~MoxDocument() override;
 
+    /// Takes memory of trees.
+    static void* operator new(std::size_t size) { return MoxNodeHeap::allocate(size); }
+
+    /// Gives the memory back, and that of nodes that were kept to be used again.
+    static void operator delete(void* document, std::size_t size) {
+        MoxNodeHeap::release(document, size);
+        MoxNodeHeap::forgetReleased();
+    }
+
     std::uint32_t getTypeID() const override;
     bool isA(std::uint32_t id) const override;
     const char* getTypeName() const override;

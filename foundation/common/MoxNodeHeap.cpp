@@ -1,79 +1,77 @@
 #include "foundation/common/MoxNodeHeap.h"
 
-#include "foundation/common/MoxChunkMemory.h"
+#include "foundation/common/MoxChunkSource.h"
 #include "foundation/common/MoxMutex.h"
 
 #include <cstdlib>
 #include <new>
-#include <sys/mman.h>
+#include <utility>
 
 namespace MoxCommonNS {
 namespace {
 
 constexpr std::size_t largestBlock = MoxChunkMemory::isWatched ? 0 : 2048;
 
-/// Chunks stand at multiples of this, so that a block finds its own.
-constexpr std::size_t chunkAlignment = 32768;
-/// A little less, which leaves the general allocator its header and lets it pack chunks.
-constexpr std::size_t chunkSize = chunkAlignment - 16;
 constexpr std::size_t blockAlignment = 8;
-
-/// Large documents take their chunks from slabs, which the system can back with one huge page each.
-constexpr std::size_t slabSize = std::size_t{1} << 21;
-constexpr std::size_t chunksOfSlab = slabSize / chunkAlignment;
-/// So many chunks in a row make a document large.
-constexpr int chunksBeforeSlabs = 16;
-
-struct Slab;
-
-/// The head of a chunk; its blocks follow.
-struct alignas(blockAlignment) Chunk {
-    int users;  // its blocks, and the thread that cuts from it
-    Slab* slab; // borrowed; null for a chunk that stands alone
-};
-
-/// The head of a slab's first chunk.
-struct alignas(blockAlignment) Slab {
-    Chunk firstChunk;
-    int users; // its chunks, and the thread that cuts from it
-
-    char* chunkAt(std::size_t index) {
-        return reinterpret_cast<char*>(this) + index * chunkAlignment;
-    }
-};
 
 constexpr std::size_t roundUp(std::size_t size) {
     return MoxChunkMemory::roundUp(size, blockAlignment);
 }
 
-void drop(Slab* slab) {
-    if (MoxMutex::interlockedDecrement(slab->users) == 0) {
-        std::free(slab);
-    }
-}
+/// A block that was released and waits to be used again.
+struct Released {
+    Released* next; // owned
+};
 
-/// Returns: how many users are left; the chunk goes with the last.
-int drop(Chunk* chunk) {
-    const int left = MoxMutex::interlockedDecrement(chunk->users);
-    if (left != 0) {
-        return left;
+/// The last blocks that a thread has released, by their size. They still count in their chunks.
+class ReleasedBlocks {
+public:
+    /// Returns: whether the block is taken; it is not when there are enough of its size.
+    bool put(void* block, std::size_t size) {
+        if (!isKept(size) || row(size).count == maxCount) {
+            return false;
+        }
+        Row& blocks = row(size);
+        blocks.first = new (block) Released{blocks.first};
+        ++blocks.count;
+        return true;
     }
-    if (chunk->slab) {
-        drop(chunk->slab);
-    } else {
-        std::free(chunk);
+
+    /// Returns: a block of just that size, or null.
+    void* take(std::size_t size) {
+        if (!isKept(size) || row(size).count == 0) {
+            return nullptr;
+        }
+        Row& blocks = row(size);
+        --blocks.count;
+        return std::exchange(blocks.first, blocks.first->next);
     }
-    return 0;
-}
+
+    static constexpr std::size_t largestSize = 512;
+
+private:
+    static constexpr std::size_t maxCount = 32;
+
+    struct Row {
+        Released* first = nullptr; // owned
+        std::size_t count = 0;
+    };
+
+    static bool isKept(std::size_t size) { return size > 0 && size <= largestSize; }
+
+    Row& row(std::size_t size) { return rows[size / blockAlignment - 1]; }
+
+    Row rows[largestSize / blockAlignment];
+};
 
 /// Where a thread cuts its next block.
 struct Cutter {
     char* cursor = nullptr;
     char* end = nullptr;
-    Chunk* chunk = nullptr; // owned, as one of its users
-    Slab* slab = nullptr;   // owned, as one of its users
-    std::size_t nextOfSlab = 0;
-    int chunksInRow = 0;
+    MoxChunk* chunk = nullptr; // owned, as one of its users
+    MoxChunkSource chunks;
+    MoxChunkSource wholeChunks;         // of packed nodes
+    ReleasedBlocks* released = nullptr; // owned; not here, where a program has little room
 
     std::size_t room() const { return static_cast<std::size_t>(end - cursor); }
 
@@ -81,20 +79,23 @@ struct Cutter {
         return static_cast<char*>(block) + size == cursor;
     }
 
-    void close() {
-        closeChunk();
-        closeSlab();
-        chunksInRow = 0;
+    void* takeReleased(std::size_t size) { return released ? released->take(size) : nullptr; }
+
+    bool putReleased(void* block, std::size_t size) {
+        if (!released && chunk) { // a thread that cuts nothing keeps nothing
+            released = new (std::nothrow) ReleasedBlocks;
+        }
+        return released && released->put(block, size);
     }
 
+    void close();
     void renew();
-    void rewind();
+    void letGo(void* block);
+    void forgetReleased();
 
 private:
+    void rewind();
     void closeChunk();
-    void closeSlab();
-    void openChunk(char* memory, std::size_t headSize, Slab* owner);
-    void openChunkOfSlab();
 };
 
 // Every node asks for it: found without a call, as what is here from the start of a program is.
@@ -104,72 +105,63 @@ private:
 struct ThreadEnd {
     bool isArmed = false;
 
-    ~ThreadEnd() { cutter.close(); }
+    ~ThreadEnd() {
+        cutter.close();
+        cutter.wholeChunks.close();
+        delete std::exchange(cutter.released, nullptr);
+    }
 };
 
 thread_local ThreadEnd threadEnd;
 
+void Cutter::close() {
+    forgetReleased();
+    closeChunk();
+    chunks.close();
+}
+
 void Cutter::closeChunk() {
-    if (chunk && drop(chunk) == 0) {
-        chunksInRow = 0; // what it was cut for is gone
+    if (chunk && chunk->drop() == 0) {
+        chunks.rewind(); // what it was cut for is gone
     }
     chunk = nullptr;
     cursor = nullptr;
     end = nullptr;
 }
 
-void Cutter::closeSlab() {
-    if (slab) {
-        drop(slab);
-    }
-    slab = nullptr;
-}
-
-void Cutter::openChunk(char* memory, std::size_t headSize, Slab* owner) {
-    chunk = new (memory) Chunk{1, owner};
-    cursor = memory + headSize;
-    end = memory + chunkSize;
-}
-
-void Cutter::openChunkOfSlab() {
-    if (slab && nextOfSlab == chunksOfSlab) {
-        closeSlab();
-    }
-    if (!slab) {
-        void* memory = MoxChunkMemory::allocateChunk(slabSize, slabSize);
-        // A wish: without it the slab is made of small pages.
-        static_cast<void>(madvise(memory, slabSize, MADV_HUGEPAGE));
-        slab = static_cast<Slab*>(memory);
-        slab->users = 1;
-        nextOfSlab = 0;
-    }
-    const std::size_t headSize = nextOfSlab == 0 ? sizeof(Slab) : sizeof(Chunk);
-    MoxMutex::interlockedIncrement(slab->users);
-    openChunk(slab->chunkAt(nextOfSlab), headSize, slab);
-    ++nextOfSlab;
-}
-
 void Cutter::renew() {
     closeChunk();
     threadEnd.isArmed = true; // the first use makes it, and so its end will come
-    if (++chunksInRow > chunksBeforeSlabs) {
-        openChunkOfSlab();
-        return;
-    }
-    closeSlab();
-    openChunk(static_cast<char*>(MoxChunkMemory::allocateChunk(chunkAlignment, chunkSize)),
-              sizeof(Chunk), nullptr);
+    chunk = chunks.take();
+    cursor = chunk->begin();
+    end = chunk->end();
 }
 
 /// Cuts from the beginning again where nothing stands any longer, so that one document after
 /// another takes the memory of one. A slab goes back: what it was cut for was large.
 void Cutter::rewind() {
-    if (slab) {
+    if (chunks.rewind()) {
+        cursor = chunk->begin();
+    } else {
         close();
-        return;
     }
-    cursor = reinterpret_cast<char*>(chunk) + sizeof(Chunk);
-    chunksInRow = 0;
+}
+
+/// Takes a block out of its chunk.
+void Cutter::letGo(void* block) {
+    auto* owner = MoxChunkMemory::findChunk<MoxChunk>(block, MoxChunk::alignment);
+    if (owner->drop() == 1 && owner == chunk) {
+        rewind(); // the thread itself is its only user
+    }
+}
+
+void Cutter::forgetReleased() {
+    for (std::size_t size = blockAlignment; size <= ReleasedBlocks::largestSize;
+         size += blockAlignment) {
+        while (void* block = takeReleased(size)) {
+            letGo(block);
+        }
+    }
 }
 
 } // namespace
@@ -178,6 +170,9 @@ void* MoxNodeHeap::allocate(std::size_t size) {
     const std::size_t rounded = roundUp(size);
     if (rounded > largestBlock) {
         return MoxChunkMemory::allocateBlock(size);
+    }
+    if (void* released = cutter.takeReleased(rounded)) {
+        return released;
     }
     if (rounded > cutter.room()) {
         cutter.renew();
@@ -196,10 +191,30 @@ void MoxNodeHeap::release(void* block, std::size_t size) {
     }
     if (cutter.isNewest(block, rounded)) {
         cutter.cursor -= rounded;
+    } else if (cutter.putReleased(block, rounded)) {
+        return;
     }
-    Chunk* chunk = MoxChunkMemory::findChunk<Chunk>(block, chunkAlignment);
-    if (drop(chunk) == 1 && chunk == cutter.chunk) {
-        cutter.rewind(); // the thread itself is its only user
+    cutter.letGo(block);
+}
+
+void MoxNodeHeap::forgetReleased() {
+    cutter.forgetReleased();
+    cutter.wholeChunks.close();
+}
+
+char* MoxNodeHeap::allocateChunk() {
+    if (MoxChunkMemory::isWatched) {
+        return static_cast<char*>(MoxChunkMemory::allocateBlock(MoxChunkSource::room));
+    }
+    threadEnd.isArmed = true;
+    return cutter.wholeChunks.take()->begin();
+}
+
+void MoxNodeHeap::releaseChunk(char* chunk) {
+    if (MoxChunkMemory::isWatched) {
+        std::free(chunk);
+    } else {
+        MoxChunkMemory::findChunk<MoxChunk>(chunk, MoxChunk::alignment)->drop();
     }
 }
 

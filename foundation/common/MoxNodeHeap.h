@@ -7,9 +7,10 @@
 
 namespace MoxCommonNS {
 
-/// Cuts blocks from chunks and gives a chunk back when its last block is gone. A block is not used
-/// again by itself, except the newest: that suits documents, which grow at their end and go as a
-/// whole, and it spares each node the book-keeping of the general allocator.
+/// Cuts blocks from chunks and gives a chunk back when its last block is gone. A few blocks that
+/// were released are used again, as a document that packs what is finished needs them; the rest is
+/// not: that suits documents, which grow at their end and go as a whole, and it spares each node
+/// the book-keeping of the general allocator.
 /// Threads: each cuts from a chunk of its own, and any may release any block. A build with a
 /// sanitizer takes every block from the general allocator, so that the sanitizer sees it.
 class DRAWMERE_API MoxNodeHeap {
@@ -19,6 +20,17 @@ public:
 
     /// Gives a block back. `size`: as allocated or grown to. Ignores: a null.
     static void release(void* block, std::size_t size);
+
+    /// Lets go of the blocks that this thread would use again, when a document is gone: they keep
+    /// their chunks.
+    static void forgetReleased();
+
+    /// Returns: memory of `MoxChunkSource::room` bytes, aligned to 8, for what is no node but lives
+    /// as long. Throws: std::bad_alloc.
+    static char* allocateChunk();
+
+    /// Gives memory of `allocateChunk` back.
+    static void releaseChunk(char* chunk);
 
     /// Makes a block of `size` bytes larger where it stands, which the newest block of the thread
     /// can be while its chunk has room. Returns: whether it has `newSize` bytes now.

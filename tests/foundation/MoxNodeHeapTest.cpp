@@ -1,5 +1,6 @@
 #include "foundation/common/MoxNodeHeap.h"
 
+#include "foundation/common/MoxChunkSource.h"
 #include "foundation/common/MoxDocument.h"
 
 #include <cstdint>
@@ -101,12 +102,47 @@ TEST(MoxNodeHeap, WhatIsAllReleasedIsCutAgainFromTheBeginning) {
     std::vector<Block> others = allocateMany(20);
     releaseAll(others);
     releaseAll(blocks);
+    MoxNodeHeap::forgetReleased();
     void* second = MoxNodeHeap::allocate(16);
     if (cutsBlocks) {
         EXPECT_LE(reinterpret_cast<std::uintptr_t>(second),
                   reinterpret_cast<std::uintptr_t>(first));
     }
     MoxNodeHeap::release(second, 16);
+}
+
+TEST(MoxNodeHeap, AFewReleasedBlocksAreUsedAgain) {
+    void* older = MoxNodeHeap::allocate(88);
+    void* newest = MoxNodeHeap::allocate(88);
+    MoxNodeHeap::release(older, 88);
+    void* other = MoxNodeHeap::allocate(96);
+    void* same = MoxNodeHeap::allocate(88);
+    if (cutsBlocks) {
+        EXPECT_NE(other, older);
+        EXPECT_EQ(same, older);
+    }
+    MoxNodeHeap::release(same, 88);
+    MoxNodeHeap::release(other, 96);
+    MoxNodeHeap::release(newest, 88);
+    MoxNodeHeap::forgetReleased();
+}
+
+TEST(MoxNodeHeap, AWholeChunkCanBeWrittenTo) {
+    std::vector<char*> chunks;
+    for (int i = 0; i < 100; ++i) { // large enough for slabs
+        chunks.push_back(MoxNodeHeap::allocateChunk());
+        std::memset(chunks.back(), i, MoxChunkSource::room);
+    }
+    for (int i = 0; i < 100; ++i) {
+        EXPECT_EQ(chunks[i][0], i);
+        EXPECT_EQ(chunks[i][MoxChunkSource::room - 1], i);
+    }
+    std::thread([&chunks] {
+        for (char* chunk : chunks) {
+            MoxNodeHeap::releaseChunk(chunk);
+        }
+    }).join();
+    MoxNodeHeap::forgetReleased();
 }
 
 TEST(MoxNodeHeap, ReleasingNothingDoesNothing) { MoxNodeHeap::release(nullptr, 0); }
