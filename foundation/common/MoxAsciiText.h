@@ -12,20 +12,11 @@
 
 namespace MoxCommonNS {
 
-/// Returns: whether all of `text` is ASCII. It looks at all units: a loop without a way out takes
-/// many at once.
+/// Returns: whether all of `text`, of bytes or UTF-16, is ASCII. It looks at all units: a loop
+/// without a way out takes many at once.
 template <typename Unit> bool isAscii(std::basic_string_view<Unit> text) {
-    std::make_unsigned_t<Unit> seen = 0;
-    for (const Unit unit : text) {
-        seen = static_cast<std::make_unsigned_t<Unit>>(seen | unit);
-    }
-    return seen < 0x80;
-}
-
-/// The same, eight units at a time.
-inline bool isAscii(std::u16string_view text) {
 #if defined(__SSE2__)
-    constexpr std::size_t blockSize = 8;
+    constexpr std::size_t blockSize = sizeof(__m128i) / sizeof(Unit);
     if (text.size() >= blockSize) {
         const auto load = [&text](std::size_t i) {
             return _mm_loadu_si128(reinterpret_cast<const __m128i*>(text.data() + i));
@@ -34,11 +25,17 @@ inline bool isAscii(std::u16string_view text) {
         for (std::size_t i = 0; i + blockSize < text.size(); i += blockSize) {
             seen = _mm_or_si128(seen, load(i));
         }
-        const __m128i beyond = _mm_andnot_si128(_mm_set1_epi16(0x7F), seen);
-        return _mm_movemask_epi8(_mm_cmpeq_epi8(beyond, _mm_setzero_si128())) == 0xFFFF;
+        const __m128i beyond = sizeof(Unit) == 1 ? _mm_set1_epi8(static_cast<char>(0x80))
+                                                 : _mm_set1_epi16(static_cast<short>(0xFF80));
+        const __m128i found = _mm_and_si128(seen, beyond);
+        return _mm_movemask_epi8(_mm_cmpeq_epi8(found, _mm_setzero_si128())) == 0xFFFF;
     }
 #endif
-    return isAscii<char16_t>(text);
+    std::make_unsigned_t<Unit> seen = 0;
+    for (const Unit unit : text) {
+        seen = static_cast<std::make_unsigned_t<Unit>>(seen | unit);
+    }
+    return seen < 0x80;
 }
 
 /// Writes ASCII units as bytes. Shape: `target[text.size()]`.

@@ -115,13 +115,18 @@ void MoxElement::setName(MoxName newUri, MoxName newPrefix, MoxName newLocal) {
 }
 
 MoxPtr<MoxNode> MoxElement::cloneAlone() const {
-    const MoxPtr<MoxElement> copy = makeBlank();
-    copy->shareOwner(*this);
+    const MoxPtr<MoxElement> copy = makeLike();
     copy->setName(uri, prefix, local);
     for (const MoxValue& attribute : getAttributes()) {
         copy->setAttribute(attribute.getKey(), attribute);
     }
     return copy;
+}
+
+MoxPtr<MoxElement> MoxElement::makeLike() const {
+    MoxPtr<MoxElement> element = makeBlank();
+    element->shareOwner(*this);
+    return element;
 }
 
 MoxPtr<MoxElement> MoxElement::makeBlank() const { return new MoxElement(nullptr); }

@@ -51,6 +51,9 @@ public:
     /// Names the element: a namespace and a prefix of 0 mean none.
     void setName(MoxName newUri, MoxName newPrefix, MoxName newLocal);
 
+    /// Returns: a new element of the same class and document, without a name or attributes.
+    MoxPtr<MoxElement> makeLike() const;
+
     /// Returns: the namespace that the element was made with, 0 for none of its own.
     MoxName getNamespaceURI() const { return uri; }
 

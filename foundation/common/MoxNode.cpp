@@ -1,6 +1,7 @@
 #include "foundation/common/MoxNode.h"
 
 #include "foundation/common/MoxDocument.h"
+#include "foundation/common/MoxPackedNode.h"
 #include "foundation/common/MoxText.h"
 #include "foundation/common/MoxTreeIterator.h"
 
@@ -36,13 +37,27 @@ MoxNode* MoxNode::getParentNode() const { return parent; }
 
 bool MoxNode::hasChildNodes() const { return firstChild != nullptr; }
 
-MoxNode* MoxNode::getFirstChild() const { return firstChild; }
-
-MoxNode* MoxNode::getPreviousSibling() const {
-    return previous && previous->nextSibling ? previous : nullptr;
+MoxNode* MoxNode::getFirstChild() const {
+    return unpacked([](const MoxNode& node) { return node.firstChild; }, *this);
 }
 
-MoxNode* MoxNode::getNextSibling() const { return nextSibling; }
+MoxNode* MoxNode::getPreviousSibling() const {
+    return unpacked([](const MoxNode& node) { return node.previousLink(); }, *this);
+}
+
+MoxNode* MoxNode::getNextSibling() const {
+    return unpacked([](const MoxNode& node) { return node.nextSibling; }, *this);
+}
+
+/// Returns: the relative that `read` finds, a node of the DOM.
+MoxNode* MoxNode::unpacked(MoxNode* (*read)(const MoxNode& node), const MoxNode& node) {
+    MoxNode* const found = read(node);
+    if (!found || found->kind != MOXNODE_PACKED) {
+        return found;
+    }
+    static_cast<MoxPackedNode*>(found)->unpack();
+    return read(node);
+}
 
 MoxDocument* MoxNode::getOwnerDocument() const { return owner ? owner->document : nullptr; }
 
@@ -129,6 +144,29 @@ MoxNode* MoxNode::appendChildText(const UnicodeString& text) {
 
 MoxTreeIterator MoxNode::getIterator() const { return MoxTreeIterator(this); }
 
+MoxNode* MoxNode::followingLink(const MoxNode* root) const {
+    if (firstChild) {
+        return firstChild;
+    }
+    const MoxNode* node = this;
+    // A node that was taken out of the walked tree has no way up to the root.
+    while (node && node != root && !node->nextSibling) {
+        node = node->parent;
+    }
+    return !node || node == root ? nullptr : node->nextSibling;
+}
+
+void MoxNode::unpackAll() {
+    MoxNode* node = this;
+    while (node) {
+        MoxNode* const next = node->followingLink(this);
+        if (node->kind == MOXNODE_PACKED) {
+            static_cast<MoxPackedNode*>(node)->unpack();
+        }
+        node = next;
+    }
+}
+
 bool MoxNode::canTake(const MoxNode* child, const MoxNode* ref) const {
     if (!child || child->kind == MOXNODE_DOCUMENT || kind == MOXNODE_TEXT ||
         (ref && ref->parent != this)) {
@@ -141,12 +179,13 @@ bool MoxNode::canTake(const MoxNode* child, const MoxNode* ref) const {
 /// may go far down in a deep one.
 bool MoxNode::isAtOrBelow(const MoxNode* other) const {
     const MoxNode* ancestor = this;
-    MoxTreeIterator below(other);
-    while (ancestor && below.hasNextNode()) {
-        if (ancestor == other || below.nextNode() == this) {
+    const MoxNode* below = other;
+    while (ancestor && below) {
+        if (ancestor == other || below == this) {
             return true;
         }
         ancestor = ancestor->parent;
+        below = below->followingLink(other);
     }
     return false;
 }
@@ -186,9 +225,19 @@ void MoxNode::unlink(MoxNode* child) {
     child->nextSibling = nullptr;
 }
 
+/// Puts `nodes`, which stand nowhere, in the place of a child.
+void MoxNode::replaceLink(MoxNode& old, std::span<const MoxPtr<MoxNode>> nodes) {
+    for (const MoxPtr<MoxNode>& node : nodes) {
+        node->addRef();
+        link(node.get(), &old);
+    }
+    unlink(&old);
+    old.release();
+}
+
 void MoxNode::setOwnerOfSubtree(const MoxPtr<DocumentLink>& link) {
-    for (MoxTreeIterator nodes = getIterator(); nodes.hasNextNode();) {
-        nodes.nextNode()->owner = link;
+    for (MoxNode* node = this; node; node = node->followingLink(this)) {
+        node->owner = link;
     }
 }
 

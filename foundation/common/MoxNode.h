@@ -6,6 +6,8 @@
 #include "foundation/common/MoxNodeIterable.h"
 #include "foundation/common/MoxPtr.h"
 
+#include <span>
+
 namespace MoxCommonNS {
 
 class MoxDocument;
@@ -16,11 +18,14 @@ enum MoxNodeType : std::uint8_t {
     MOXNODE_ELEMENT = 1,
     MOXNODE_TEXT = 3,
     MOXNODE_DOCUMENT = 9,
+    MOXNODE_PACKED = 255, ///< no node of the DOM: a `MoxPackedNode`
 };
 
 /// A node: it holds a reference to each of its children, and its children know it without one.
 /// A pointer to a node that an operation returns is borrowed; who keeps it longer than the tree
 /// does holds it in a `MoxPtr`. No operation recurses by the depth of the tree.
+/// Finished parts of a tree may be packed (`MoxPackedNode`); whoever asks for relatives or for a
+/// walk gets nodes all the same.
 class DRAWMERE_API MoxNode : public MoxNodeIterable {
 public:
     /// What `isA` and `getTypeID` know this class by.
@@ -102,7 +107,12 @@ public:
     /// Returns: a walk over this node and all below it, in document order.
     MoxTreeIterator getIterator() const;
 
-    // Plain readings of the links, for walks that can't afford a virtual call for each step.
+    /// Makes nodes again of all that is packed below this node.
+    /// Throws: std::bad_alloc; every part of the tree is packed or unpacked then.
+    void unpackAll();
+
+    // Plain readings of the links, for walks that can't afford a virtual call for each step. They
+    // show what is packed as it is.
     /// Returns: the parent, borrowed, or null.
     MoxNode* parentLink() const { return parent; }
 
@@ -111,6 +121,15 @@ public:
 
     /// Returns: the neighbour behind this node, borrowed, or null.
     MoxNode* nextLink() const { return nextSibling; }
+
+    /// Returns: the neighbour before this node, borrowed, or null.
+    MoxNode* previousLink() const { return previous && previous->nextSibling ? previous : nullptr; }
+
+    /// Returns: the last child, borrowed, or null.
+    MoxNode* lastLink() const { return firstChild ? firstChild->previous : nullptr; }
+
+    /// Returns: the node behind this one in document order, in the subtree of `root`, or null.
+    MoxNode* followingLink(const MoxNode* root) const;
 
     /// Returns: what the node is.
     MoxNodeType kindLink() const { return kind; }
@@ -132,6 +151,8 @@ protected:
     void shareOwner(const MoxNode& other);
 
 private:
+    friend class MoxPackedNode;
+
     struct DocumentLink;
 
     bool canTake(const MoxNode* child, const MoxNode* ref) const;
@@ -141,8 +162,8 @@ private:
     void unlink(MoxNode* child);
     void setOwnerOfSubtree(const MoxPtr<DocumentLink>& link);
     void releaseChildren();
-
-    MoxNode* lastLink() const { return firstChild ? firstChild->previous : nullptr; }
+    void replaceLink(MoxNode& old, std::span<const MoxPtr<MoxNode>> nodes);
+    static MoxNode* unpacked(MoxNode* (*read)(const MoxNode& node), const MoxNode& node);
 
     MoxNodeType kind;
     MoxNode* parent = nullptr;      // borrowed

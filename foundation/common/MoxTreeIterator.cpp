@@ -1,17 +1,20 @@
 #include "foundation/common/MoxTreeIterator.h"
 
+#include "foundation/common/MoxPackedNode.h"
+
 namespace MoxCommonNS {
 namespace {
 
+/// The node behind `node`. What is packed becomes nodes as the walk gets there.
 const MoxNode* findFollowing(const MoxNode* node, const MoxNode* root) {
-    if (node->firstLink()) {
-        return node->firstLink();
+    const MoxNode* next = node->followingLink(root);
+    while (next && next->kindLink() == MOXNODE_PACKED) {
+        // To whoever walks, the tree is the same.
+        // NOLINTNEXTLINE(cppcoreguidelines-pro-type-const-cast)
+        const_cast<MoxPackedNode*>(static_cast<const MoxPackedNode*>(next))->unpack();
+        next = node->followingLink(root);
     }
-    // A node that was taken out of the walked tree has no way up to the root.
-    while (node && node != root && !node->nextLink()) {
-        node = node->parentLink();
-    }
-    return !node || node == root ? nullptr : node->nextLink();
+    return next;
 }
 
 } // namespace

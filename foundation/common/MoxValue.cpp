@@ -215,7 +215,8 @@ void MoxValue::releaseText() {
     }
 }
 
-std::string_view MoxValue::getAsciiText() const {
+/// Returns: the ASCII bytes of a string on the heap, nothing of any other value.
+std::string_view MoxValue::getLongText() const {
     if (form == asciiForm) {
         auto* heap = load<HeapText*>();
         return {heap->units<char>(), heap->length};
@@ -226,8 +227,7 @@ std::string_view MoxValue::getAsciiText() const {
     if (form == keptForm) {
         return getKeptText()->getText();
     }
-    return type == MOXVALUE_STRING && form <= inlineCapacity ? std::string_view(bytes, form)
-                                                             : std::string_view();
+    return {};
 }
 
 std::u16string_view MoxValue::getWideText() const {

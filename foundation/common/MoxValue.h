@@ -173,8 +173,15 @@ public:
     /// Returns: true for a string that is kept as UTF-16, which `getWideText` then gives.
     bool isWideText() const { return form == wideForm; }
 
+    /// Returns: true for a string that is in memory of its own, or kept in another form.
+    bool hasOwnMemory() const { return form == adoptedForm || form == keptForm; }
+
     /// Returns: the ASCII bytes of a string that is not wide, valid as long as the value.
-    std::string_view getAsciiText() const;
+    std::string_view getAsciiText() const {
+        return type == MOXVALUE_STRING && form <= inlineCapacity ? std::string_view(bytes, form)
+                                                                 : getLongText();
+    }
+
     /// Returns: the UTF-16 units of a wide string, valid as long as the value.
     std::u16string_view getWideText() const;
 
@@ -183,6 +190,9 @@ public:
     const MoxKeptText* getKeptText() const {
         return form == keptForm ? load<const MoxKeptText*>() : nullptr;
     }
+
+    /// Returns: the four bytes that an integer, a real, a name, a length or a colour consists of.
+    std::uint32_t getBits() const { return load<std::uint32_t>(); }
 
     /// Returns: the single-precision number of a real or of a length in points.
     float getFloat() const { return load<float>(); }
@@ -234,6 +244,7 @@ private:
 
     void cloneHeap();
     void freeHeap();
+    std::string_view getLongText() const;
     void releaseText();
     void storeText(std::u16string_view text);
     void storeAscii(std::string_view text);

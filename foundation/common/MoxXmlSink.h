@@ -84,7 +84,7 @@ private:
     void handOn(const char* bytes, std::size_t count, bool isLast);
     void convert(const char* bytes, std::size_t count, bool isLast);
 
-    static constexpr std::size_t bufferSize = 65536;
+    static constexpr std::size_t bufferSize = 16384;
 
     std::ostream& stream; // borrowed
     const char* encodingName = "UTF-8";

@@ -4,6 +4,7 @@
 #include "foundation/common/MoxDocument.h"
 #include "foundation/common/MoxKeptText.h"
 #include "foundation/common/MoxNameTable.h"
+#include "foundation/common/MoxPackedForm.h"
 #include "foundation/common/MoxXmlOptions.h"
 #include "foundation/common/MoxXmlSink.h"
 
@@ -32,6 +33,13 @@ private:
 
     void writeTree(const MoxNode* root);
     void openNode(const MoxNode& node);
+    void beginElement();
+    void beginContent(bool hasText);
+    void endContent();
+    void writePacked(std::string_view bytes);
+    void writePackedElement(const MoxPackedHead& head, MoxPackedCursor& cursor);
+    void writePackedValue(const MoxPackedValue& value, bool inAttribute);
+    void writePairs(const MoxPackedValue& value);
     void closeElement(const MoxElement& element);
     void writeStartTag(const MoxElement& element);
     void writeTagName(const MoxElement& element);
@@ -59,7 +67,8 @@ private:
     MoxXmlOptions options;
     std::vector<Declaration> declarations;
     std::size_t depth = 0;
-    const MoxElement* mixedElement = nullptr; // borrowed; the outermost one that holds text
+    std::size_t mixedDepth = 0;      // of the outermost element that holds text, 0 outside of one
+    std::vector<MoxName> openPacked; // the packed elements whose children are being written
 };
 
 } // namespace MoxCommonNS

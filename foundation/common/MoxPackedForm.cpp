@@ -1,0 +1,269 @@
+#include "foundation/common/MoxPackedForm.h"
+
+#include "foundation/common/MoxDigitPairs.h"
+#include "foundation/common/MoxElement.h"
+#include "foundation/common/MoxFewBytes.h"
+#include "foundation/common/MoxNameTable.h"
+#include "foundation/common/MoxPackedNode.h"
+#include "foundation/common/MoxText.h"
+
+#include <bit>
+#include <limits>
+
+namespace MoxCommonNS {
+namespace {
+
+constexpr std::uint32_t maxName = std::numeric_limits<std::uint16_t>::max();
+constexpr int maxAttributes = std::numeric_limits<std::uint8_t>::max();
+constexpr std::size_t maxShort = std::numeric_limits<std::uint8_t>::max();
+/// A longer text is not copied: it stays in the tree, in memory of its own.
+constexpr std::size_t maxText = 32768;
+/// Shorter texts gain little by packing.
+constexpr std::size_t minPairs = 128;
+/// Packed children that are copied with their parent; more stay where they are.
+constexpr std::size_t maxCopied = 2048;
+
+/// Returns: the end of what was written.
+char* writeFew(char* out, std::string_view text) {
+    *out++ = static_cast<char>(MoxPackedValue::shortText);
+    *out++ = static_cast<char>(text.size());
+    copyFewBytes(out, text.data(), text.size());
+    return out + text.size();
+}
+
+char* writeShort(char* out, std::string_view text) {
+    *out++ = static_cast<char>(MoxPackedValue::shortText);
+    *out++ = static_cast<char>(text.size());
+    std::memcpy(out, text.data(), text.size());
+    return out + text.size();
+}
+
+template <typename T> char* writeNumber(char* out, T number) {
+    std::memcpy(out, &number, sizeof(number));
+    return out + sizeof(number);
+}
+
+bool fitsIntoBits(const MoxValue& value) {
+    constexpr unsigned int types = 1U << MOXVALUE_INTEGER | 1U << MOXVALUE_REAL |
+                                   1U << MOXVALUE_NAME | 1U << MOXVALUE_LENGTH |
+                                   1U << MOXVALUE_COLOR;
+    return (types >> value.getType() & 1U) != 0;
+}
+
+/// The most bytes that `writeSmall` writes.
+constexpr std::size_t smallSize = 2 + maxFewBytes;
+
+/// Returns: the end of what was written, null for a value that is not small.
+[[gnu::always_inline]] inline char* writeSmall(char* out, const MoxValue& value) {
+    if (fitsIntoBits(value)) {
+        *out = static_cast<char>(value.getType());
+        return writeNumber(out + 1, value.getBits());
+    }
+    if (value.getType() != MOXVALUE_STRING || value.isWideText() || value.hasOwnMemory()) {
+        return nullptr;
+    }
+    const std::string_view text = value.getAsciiText();
+    return text.size() <= maxFewBytes ? writeFew(out, text) : nullptr;
+}
+
+char* writeLengths(char* out, std::uint8_t form, std::size_t length) {
+    *out++ = static_cast<char>(form);
+    const auto count = static_cast<std::uint32_t>(length);
+    std::memcpy(out, &count, sizeof(count));
+    return out + sizeof(count);
+}
+
+/// Returns: the end of what was written, null for a text that is no list of numbers.
+char* writePairs(char* out, std::string_view text) {
+    char* const count = writeLengths(out, MoxPackedValue::pairText, text.size());
+    char* const pairs = count + sizeof(std::uint32_t);
+    const auto size = static_cast<std::uint32_t>(MoxDigitPairs::pack(text, pairs));
+    std::memcpy(count, &size, sizeof(size));
+    return size == 0 ? nullptr : pairs + size;
+}
+
+bool appendAscii(MoxPackedBytes& out, std::string_view text) {
+    constexpr std::size_t maxHead = 1 + 2 * sizeof(std::uint32_t);
+    if (text.size() > maxText) {
+        return false;
+    }
+    char* const place = out.room(maxHead + text.size());
+    char* end = text.size() >= minPairs ? writePairs(place, text) : nullptr;
+    if (!end && text.size() <= maxShort) {
+        end = writeShort(place, text);
+    } else if (!end) {
+        end = writeLengths(place, MoxPackedValue::longText, text.size());
+        std::memcpy(end, text.data(), text.size());
+        end += text.size();
+    }
+    out.advance(end);
+    return true;
+}
+
+bool appendWide(MoxPackedBytes& out, std::u16string_view text) {
+    constexpr std::size_t maxHead = 1 + sizeof(std::uint32_t);
+    if (text.size() > maxText) {
+        return false;
+    }
+    const std::size_t size = text.size() * sizeof(char16_t);
+    char* const place = out.room(maxHead + size);
+    char* const end = writeLengths(place, MoxPackedValue::wideText, text.size());
+    std::memcpy(end, text.data(), size);
+    out.advance(end + size);
+    return true;
+}
+
+std::uint8_t findMark(const MoxElement& element) {
+    unsigned int mark = MoxPackedHead::element;
+    for (const MoxNode* child = element.firstLink(); child; child = child->nextLink()) {
+        mark |= MoxPackedHead::hasChildren;
+        if (child->kindLink() == MOXNODE_TEXT) {
+            mark |= MoxPackedHead::holdsText;
+        }
+    }
+    return static_cast<std::uint8_t>(mark);
+}
+
+bool isKept(const MoxElement& element, const MoxPackRules& rules) {
+    const MoxName name = element.localLink();
+    return name == rules.keptElement || (name == rules.neverEmpty && !element.firstLink()) ||
+           element.getNamespaceURI() || element.prefixLink() || name.number > maxName ||
+           element.attributeLinks().getLength() > maxAttributes;
+}
+
+bool isKept(MoxName key, const MoxPackRules& rules) {
+    // What is no plain name may declare a namespace or need a look at its neighbours.
+    return key == rules.keptAttribute || key.number > maxName ||
+           !MoxNameTable::getEntry(key).isPlain;
+}
+
+bool appendElement(MoxPackedBytes& out, const MoxElement& element, const MoxPackRules& rules) {
+    constexpr std::size_t headSize = 2 + sizeof(std::uint16_t);
+    constexpr std::size_t keySize = sizeof(std::uint16_t);
+    if (isKept(element, rules)) {
+        return false;
+    }
+    const MoxAttributeMap attributes = element.attributeLinks();
+    const auto count = static_cast<std::uint8_t>(attributes.getLength());
+    const std::size_t allSmall = count * (keySize + smallSize);
+    char* end = out.room(headSize + allSmall);
+    *end++ = static_cast<char>(findMark(element));
+    *end++ = static_cast<char>(count);
+    end = writeNumber(end, static_cast<std::uint16_t>(element.localLink().number));
+    for (const MoxValue& attribute : attributes) {
+        const MoxName key = attribute.getKey();
+        if (isKept(key, rules)) {
+            return false;
+        }
+        char* const place = writeNumber(end, static_cast<std::uint16_t>(key.number));
+        end = writeSmall(place, attribute);
+        if (!end) {
+            out.advance(place);
+            if (!MoxPackedValue::append(out, attribute)) {
+                return false;
+            }
+            end = out.room(allSmall);
+        }
+    }
+    out.advance(end);
+    return true;
+}
+
+bool appendNode(MoxPackedBytes& out, const MoxNode& node, const MoxPackRules& rules) {
+    if (node.getReferenceCount() != 1) {
+        return false;
+    }
+    switch (node.kindLink()) {
+    case MOXNODE_ELEMENT:
+        return appendElement(out, static_cast<const MoxElement&>(node), rules);
+    case MOXNODE_TEXT:
+        out.appendNumber<std::uint8_t>(MoxPackedHead::text);
+        return MoxPackedValue::append(out, static_cast<const MoxText&>(node).getContent());
+    case MOXNODE_PACKED: {
+        const std::string_view bytes = static_cast<const MoxPackedNode&>(node).getBytes();
+        if (bytes.size() > maxCopied) {
+            return false;
+        }
+        out.append(bytes);
+        return true;
+    }
+    default:
+        return false;
+    }
+}
+
+bool appendSubtree(MoxPackedBytes& out, const MoxNode& root, const MoxPackRules& rules) {
+    const MoxNode* node = &root;
+    while (appendNode(out, *node, rules)) {
+        if (node->firstLink()) {
+            node = node->firstLink();
+            continue;
+        }
+        while (node != &root && !node->nextLink()) {
+            node = node->parentLink();
+            out.appendNumber<std::uint8_t>(MoxPackedHead::end);
+        }
+        if (node == &root) {
+            return true;
+        }
+        node = node->nextLink();
+    }
+    return false;
+}
+
+} // namespace
+
+bool MoxPackedValue::append(MoxPackedBytes& out, const MoxValue& value) {
+    if (const char* end = writeSmall(out.room(smallSize), value)) {
+        out.advance(end);
+        return true;
+    }
+    if (value.getType() != MOXVALUE_STRING || value.hasOwnMemory()) {
+        return false;
+    }
+    return value.isWideText() ? appendWide(out, value.getWideText())
+                              : appendAscii(out, value.getAsciiText());
+}
+
+MoxValue MoxPackedValue::toValue() const {
+    switch (form) {
+    case MOXVALUE_INTEGER:
+        return {static_cast<int>(number)};
+    case MOXVALUE_REAL:
+        return {std::bit_cast<float>(number)};
+    case MOXVALUE_NAME:
+        return {MoxName::fromNumber(number)};
+    case MOXVALUE_LENGTH:
+        return {MoxLength::fromRaw(std::bit_cast<float>(number))};
+    case MOXVALUE_COLOR:
+        return {MoxColor(number)};
+    case pairText: {
+        std::string text(number + 1, '\0');
+        MoxDigitPairs::unpack(bytes.data(), number, text.data());
+        return MoxValue::fromAscii({text.data(), number});
+    }
+    case wideText: {
+        std::u16string text(number, u'\0');
+        std::memcpy(text.data(), bytes.data(), bytes.size());
+        return {std::u16string_view(text)};
+    }
+    default:
+        return MoxValue::fromAscii(bytes);
+    }
+}
+
+bool MoxPacker::append(MoxPackedBytes& out, const MoxNode& root, const MoxPackRules& rules) {
+    const std::size_t before = out.size();
+    try {
+        if (appendSubtree(out, root, rules)) {
+            return true;
+        }
+    } catch (...) { // no memory
+        out.cut(before);
+        throw;
+    }
+    out.cut(before);
+    return false;
+}
+
+} // namespace MoxCommonNS
