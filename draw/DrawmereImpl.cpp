@@ -175,6 +175,7 @@ void DrawmereImpl::finishRootSvg() {
         SVGOptimizer::optimize(root);
     }
     if (config->svgType == SVGConfig::SVGTYPE_TINY && config->wispMode) {
+        treeManager->stopPacking();
         makeQuillet().optimizeQuillet(root);
         // Anchors are texts, which the passes replace: those noted stand in the tree no longer.
         wantsWalk = true;
@@ -183,6 +184,7 @@ void DrawmereImpl::finishRootSvg() {
 
 SVGDocument* DrawmereImpl::getDocument() {
     wantsWalk = true;
+    treeManager->stopPacking();
     return treeManager->document.get();
 }
 
@@ -242,6 +244,9 @@ MoxValue DrawmereImpl::getInheritAttribute(const MoxElement* element, const MoxN
 }
 
 MoxPtr<SVGElement> DrawmereImpl::createElement(SVGName name) const {
+    if (getGContext()->getType() < ELEMENT_TYPE_PATTERN) { // definitions hold little
+        treeManager->packFinished(groupManager->getGroupRootNode());
+    }
     return treeManager->document->createSVGElement(name);
 }
 

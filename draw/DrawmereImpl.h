@@ -190,8 +190,9 @@ public:
     /// Completes the tree; the document can be saved afterwards.
     void finishRootSvg();
 
-    /// Returns: the document, borrowed; it lives on in any `MoxPtr` that takes it. Who changes its
-    /// tree has asked for it here: a document that nobody asked for is known without a walk.
+    /// Returns: the document, borrowed; it lives on in any `MoxPtr` that takes it. Who looks into
+    /// its tree or changes it has asked for it here: what is finished in a document that nobody
+    /// asked for is packed, and pointers to it end.
     SVGDocument* getDocument();
 
     /// Returns: whether the document may hold links; false is certain.

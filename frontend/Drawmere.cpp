@@ -109,6 +109,8 @@ void Drawmere::initRootSvg(std::ostream* stream) {
 void Drawmere::openImpl() {
     closeImpl();
     impl = createImplInstance(config->svgType);
+    // Callers draw, and see the tree by `DrawmereImpl::getDocument` alone.
+    impl->treeManager->packsFinished = true;
     try {
         impl->initRootSvg();
     } catch (...) { // no memory

@@ -1,6 +1,5 @@
 #include "post/SVGOptimizer.h"
 
-#include "foundation/common/MoxTreeIterator.h"
 #include "tree/SVGUtil.h"
 
 #include <unicode/locid.h>
@@ -9,7 +8,6 @@ namespace DrawmereNS {
 
 using MoxCommonNS::MoxName;
 using MoxCommonNS::MoxNode;
-using MoxCommonNS::MoxTreeIterator;
 using TalCommon::SVGName;
 
 namespace {
@@ -30,15 +28,17 @@ bool isEmptyGroup(const MoxNode& node) {
 
 /// On purpose: an empty group goes only when the walk gives the node behind it. So the last node of
 /// a document stays, and so does a group that loses its last group, as it was tested before.
+/// What is packed holds no empty group.
 void removeEmptyGroups(MoxElement& root) {
     MoxNode* pending = nullptr;
-    MoxTreeIterator walk(&root);
-    while (walk.hasNextNode()) {
-        MoxNode* node = walk.nextNode();
+    MoxNode* node = &root;
+    while (node) {
+        MoxNode* const next = node->followingLink(&root);
         if (pending) {
             pending->getParentNode()->removeChild(pending);
         }
         pending = isEmptyGroup(*node) ? node : nullptr;
+        node = next;
     }
 }
 

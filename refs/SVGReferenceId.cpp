@@ -58,13 +58,22 @@ MoxElement* findFirstChild(const MoxElement& element) {
     return toElement(child);
 }
 
+/// What is packed holds neither links nor anchors.
+MoxElement* findNextSibling(const MoxElement& element) {
+    MoxNode* next = element.nextLink();
+    while (next && next->kindLink() == MoxCommonNS::MOXNODE_PACKED) {
+        next = next->nextLink();
+    }
+    return toElement(next);
+}
+
 /// Returns: the element after `element` in document order, within the subtree of `root`, or null.
 /// On purpose: a text between two elements ends the row of siblings, as it does for all walks over
 /// them; links behind it stay as they are.
 MoxElement* findFollowing(MoxElement* element, const MoxElement* root, bool enterChildren) {
     MoxElement* next = enterChildren ? findFirstChild(*element) : nullptr;
     while (!next && element && element != root) {
-        next = toElement(element->nextLink());
+        next = findNextSibling(*element);
         element = toElement(element->parentLink());
     }
     return next;

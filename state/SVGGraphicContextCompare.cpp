@@ -73,10 +73,13 @@ bool rootTakesFamily(MoxElement* root, const UnicodeString& family) {
     if (!root) {
         return false;
     }
-    if (!root->hasAttribute(SVGName(SVGName::font_family))) {
-        root->setAttribute(SVGName(SVGName::font_family), MoxValue(family));
+    const MoxName name = SVGName(SVGName::font_family);
+    const MoxValue& known = root->getAttribute(name);
+    if (known.getType() != MoxValueType::MOXVALUE_NULL) {
+        return saysFamily(known, family);
     }
-    return saysFamily(root->getAttribute(SVGName(SVGName::font_family)), family);
+    root->setAttribute(name, MoxValue(family));
+    return saysFamily(root->getAttribute(name), family);
 }
 
 /// Writes a word; null, for what is normal, writes nothing.

@@ -2,6 +2,7 @@
 
 #include "SVGConfig.h"
 #include "foundation/common/MoxNameTable.h"
+#include "foundation/common/MoxPackedNode.h"
 #include "state/SVGGraphicContext.h"
 #include "tree/SVGUtil.h"
 
@@ -45,6 +46,17 @@ constexpr RootProfile rootProfiles[] = {
     {SVGConfig::SVGTYPE_BASIC, u"basic"},
     {SVGConfig::SVGTYPE_TINY, u"tiny"},
 };
+
+/// Links and what they may lead to are looked for when the document is finished, and so are empty
+/// groups.
+const MoxCommonNS::MoxPackRules& getPackRules() {
+    static const MoxCommonNS::MoxPackRules rules = {
+        .keptElement = SVGName(SVGName::a),
+        .keptAttribute = SVGName(SVGName::id),
+        .neverEmpty = SVGName(SVGName::g),
+    };
+    return rules;
+}
 
 } // namespace
 
@@ -143,6 +155,26 @@ void SVGTreeManager::appendNewGroup(SVGElement* group, bool makeCurrent) {
     if (context) {
         context->setClipPathAttrVal(group, true);
     }
+}
+
+void SVGTreeManager::packFinished(SVGElement* group) {
+    if (!packsFinished) {
+        return;
+    }
+    packLast(group, keptInGroup);
+    packLast(currentNode.get(), keptAtCursor);
+}
+
+void SVGTreeManager::packLast(MoxNode* parent, const MoxNode*& kept) const {
+    if (parent && parent->lastLink() != kept &&
+        !MoxCommonNS::MoxPackedNode::packLast(*parent, getPackRules())) {
+        kept = parent->lastLink();
+    }
+}
+
+void SVGTreeManager::stopPacking() {
+    packsFinished = false;
+    document->unpackAll();
 }
 
 bool SVGTreeManager::hasEmptyGroup() const {

@@ -56,6 +56,14 @@ public:
     /// Switches adding on again.
     void defuseStopLock() { unlocked = true; }
 
+    /// Packs the elements that came last into `group`, which may be null, and at the cursor, so that
+    /// a finished document takes little memory. The caller is about to make another element.
+    /// Ignores: what somebody holds, and every call unless `packsFinished` is set.
+    void packFinished(SVGElement* group);
+
+    /// Makes nodes again of all that is packed, and packs no more.
+    void stopPacking();
+
     /// Returns: the element that receives the next one, borrowed; null before there is a root.
     SVGElement* getCurrentNode() const { return currentNode.get(); }
 
@@ -68,15 +76,21 @@ public:
     std::deque<MoxPtr<MoxElement>> nodeStack;   ///< kept, as callers may take them out of the tree
     std::deque<SVGFont> fontStack;              ///< the fonts saved by `push`
     SVGGraphicContext* context = nullptr;       ///< borrowed
+    bool packsFinished = false;                 ///< whether nobody looks into the tree
     bool unlocked = true;                       ///< false while a gradient takes stops only
     MoxPtr<SVGElement> defsElement;             ///< once there is one
     std::vector<MoxPtr<SVGElement>> clipGroups; ///< all that came
 
 private:
+    void packLast(MoxNode* parent, const MoxNode*& kept) const;
     bool canAdd() const;
     void setRootAttributes(SVGElement& root, const UnicodeString& version,
                            const SVGConfig& config) const;
     void stampContext(SVGElement* element);
+
+    // What could not be packed and need not be tried again; only ever compared.
+    const MoxNode* keptInGroup = nullptr;
+    const MoxNode* keptAtCursor = nullptr;
 };
 
 } // namespace DrawmereNS

@@ -14,9 +14,10 @@ namespace {
 constexpr unsigned seedCount = 40;
 constexpr int callCount = 500;
 
-std::vector<std::string> drawAnything(unsigned seed,
-                                      RandomCalls::Temper temper = RandomCalls::WILD) {
+std::vector<std::string> drawAnything(unsigned seed, RandomCalls::Temper temper = RandomCalls::WILD,
+                                      bool unpacks = false) {
     RandomCalls calls(seed, temper);
+    calls.unpacks = unpacks;
     RandomRun run(calls);
     return run.draw(callCount);
 }
@@ -32,6 +33,15 @@ TEST(RandomCalls, EveryDocumentIsWellFormed) {
             }
         }
         EXPECT_GT(count, seedCount * 10);
+    }
+}
+
+TEST(RandomCalls, PackingIsNotSeen) {
+    for (const auto temper : {RandomCalls::WILD, RandomCalls::TAME, RandomCalls::ORDERLY}) {
+        for (unsigned seed = 0; seed < seedCount; ++seed) {
+            EXPECT_EQ(drawAnything(seed, temper), drawAnything(seed, temper, /*unpacks=*/true))
+                << "seed " << seed;
+        }
     }
 }
 

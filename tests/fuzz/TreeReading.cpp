@@ -73,14 +73,14 @@ std::string toXmlText(const UnicodeString& text) {
 
 std::vector<XmlEvent> readTree(const MoxDocument& document) {
     std::vector<XmlEvent> events;
-    const MoxNode* node = document.firstLink();
+    const MoxNode* node = document.getFirstChild();
     while (node) {
         open(events, node);
-        const MoxNode* next = node->firstLink();
+        const MoxNode* next = node->getFirstChild();
         while (!next && node && node != &document) {
             close(events, node);
-            next = node->nextLink();
-            node = node->parentLink();
+            next = node->getNextSibling();
+            node = node->getParentNode();
         }
         node = next;
     }

@@ -20,13 +20,20 @@ void checkDocument(const std::string& document, const RandomCalls& calls, bool i
     require(fault.empty(), fault);
 }
 
-void checkTree(const MoxDocument& document) {
+std::string save(const MoxDocument& document) {
     std::ostringstream stream;
     document.save(u"", u"", stream, nullptr, u"", u"");
-    const XmlReading reading = readXml(stream.str());
+    return stream.str();
+}
+
+void checkTree(const MoxDocument& document) {
+    const std::string text = save(document);
+    const XmlReading reading = readXml(text);
     require(reading.error.empty(), reading.error);
     const std::string difference = findDifference(readTree(document), reading.events);
     require(difference.empty(), difference);
+    // To read the tree has made nodes of all that was packed.
+    require(save(document) == text, "unpacked, the tree has another text");
 }
 
 } // namespace

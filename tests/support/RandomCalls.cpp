@@ -325,6 +325,10 @@ UnicodeString getOpenDefinition(const DrawmereImpl& impl) {
 } // namespace
 
 void RandomCalls::makeCall(Drawmere& page) {
+    if (unpacks) {
+        page.impl->treeManager->stopPacking();
+        page.impl->treeManager->packsFinished = ++unpackCount % 4 != 0;
+    }
     const std::size_t idCount = ids.size();
     const UnicodeString clip = page.impl->clipPathId;
     const auto picked = pickCall(*this, *page.impl);

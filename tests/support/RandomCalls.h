@@ -60,6 +60,7 @@ public:
     }
 
     const Temper temper;
+    bool unpacks = false; ///< whether what is packed in the tree becomes nodes before most calls
     const TempDir directory;              ///< where images are copied to
     std::vector<UnicodeString> ids;       ///< of definitions in the open document, in order
     std::vector<UnicodeString> lostIds;   ///< of those whose start call wrote no definition
@@ -73,6 +74,7 @@ private:
     bool keepOrder(Call picked);
     void finishDocument(Drawmere& page);
 
+    unsigned unpackCount = 0;
     std::vector<Call> openStates; ///< what ends each of them, where order is kept
 };
 
