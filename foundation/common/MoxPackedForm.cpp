@@ -22,6 +22,9 @@ constexpr std::size_t maxText = 32768;
 constexpr std::size_t minPairs = 128;
 /// Packed children that are copied with their parent; more stay where they are.
 constexpr std::size_t maxCopied = 2048;
+/// What consists of more nodes stays as it is: its children were packed as they came, where that
+/// could be. Without an end, parts that can't be packed would be walked for each of their parents.
+constexpr int maxNodes = 64;
 
 /// Returns: the end of what was written.
 char* writeFew(char* out, std::string_view text) {
@@ -113,6 +116,14 @@ bool appendWide(MoxPackedBytes& out, std::u16string_view text) {
     return true;
 }
 
+bool hasManyChildren(const MoxElement& element) {
+    const MoxNode* child = element.firstLink();
+    for (int i = 0; child && i < maxNodes; ++i) {
+        child = child->nextLink();
+    }
+    return child != nullptr;
+}
+
 std::uint8_t findMark(const MoxElement& element) {
     unsigned int mark = MoxPackedHead::element;
     for (const MoxNode* child = element.firstLink(); child; child = child->nextLink()) {
@@ -128,7 +139,7 @@ bool isKept(const MoxElement& element, const MoxPackRules& rules) {
     const MoxName name = element.localLink();
     return name == rules.keptElement || (name == rules.neverEmpty && !element.firstLink()) ||
            element.getNamespaceURI() || element.prefixLink() || name.number > maxName ||
-           element.attributeLinks().getLength() > maxAttributes;
+           element.attributeLinks().getLength() > maxAttributes || hasManyChildren(element);
 }
 
 bool isKept(MoxName key, const MoxPackRules& rules) {
@@ -194,7 +205,7 @@ bool appendNode(MoxPackedBytes& out, const MoxNode& node, const MoxPackRules& ru
 
 bool appendSubtree(MoxPackedBytes& out, const MoxNode& root, const MoxPackRules& rules) {
     const MoxNode* node = &root;
-    while (appendNode(out, *node, rules)) {
+    for (int i = 0; i < maxNodes && appendNode(out, *node, rules); ++i) {
         if (node->firstLink()) {
             node = node->firstLink();
             continue;

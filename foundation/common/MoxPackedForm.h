@@ -105,7 +105,8 @@ public:
     MoxPacker() = delete;
 
     /// Appends `root` and all below it. Returns: false, with nothing appended, when a node is held
-    /// by others than its parent, is kept by `rules`, or doesn't fit into the form.
+    /// by others than its parent, is kept by `rules`, or doesn't fit into the form, and when there
+    /// are many nodes.
     static bool append(MoxPackedBytes& out, const MoxNode& root, const MoxPackRules& rules);
 };
 

@@ -172,6 +172,21 @@ TEST_F(MoxPackedNodeTest, ASmallPackedRowGoesIntoItsParentAndALargeOneDoesNot) {
     }
 }
 
+TEST_F(MoxPackedNodeTest, WhatConsistsOfManyNodesStaysAsItIs) {
+    for (const int count : {30, 100}) {
+        MoxElement* group = add(u"group");
+        for (int i = 0; i < count; ++i) {
+            add(u"item", group);
+        }
+        EXPECT_EQ(packLast(), count == 30);
+        MoxElement* inner = add(u"item");
+        for (int i = 0; i < count; ++i) {
+            inner = add(u"item", inner);
+        }
+        EXPECT_EQ(packLast(), count == 30);
+    }
+}
+
 TEST_F(MoxPackedNodeTest, RelativesAreNodesAgain) {
     for (int i = 0; i < 3; ++i) {
         add(u"item")->setAttribute(MoxName(u"number"), MoxValue(i));
