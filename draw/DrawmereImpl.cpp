@@ -175,7 +175,7 @@ void DrawmereImpl::finishRootSvg() {
         SVGOptimizer::optimize(root);
     }
     if (config->svgType == SVGConfig::SVGTYPE_TINY && config->wispMode) {
-        treeManager->stopPacking();
+        treeManager->stopPacking(nullptr);
         makeQuillet().optimizeQuillet(root);
         // Anchors are texts, which the passes replace: those noted stand in the tree no longer.
         wantsWalk = true;
@@ -184,7 +184,8 @@ void DrawmereImpl::finishRootSvg() {
 
 SVGDocument* DrawmereImpl::getDocument() {
     wantsWalk = true;
-    treeManager->stopPacking();
+    const SVGGroupManager* page = savedGroupManager ? savedGroupManager : groupManager;
+    treeManager->stopPacking(page->getGroupRootNode());
     return treeManager->document.get();
 }
 

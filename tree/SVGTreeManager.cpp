@@ -172,9 +172,15 @@ void SVGTreeManager::packLast(MoxNode* parent, const MoxNode*& kept) const {
     }
 }
 
-void SVGTreeManager::stopPacking() {
-    packsFinished = false;
+void SVGTreeManager::stopPacking(SVGElement* group) {
+    if (!packsFinished) {
+        return; // nothing is packed, and a walk to find that out takes long
+    }
+    if (group) {
+        group->unpackAll();
+    }
     document->unpackAll();
+    packsFinished = false;
 }
 
 bool SVGTreeManager::hasEmptyGroup() const {

@@ -56,13 +56,14 @@ public:
     /// Switches adding on again.
     void defuseStopLock() { unlocked = true; }
 
-    /// Packs the elements that came last into `group`, which may be null, and at the cursor, so that
-    /// a finished document takes little memory. The caller is about to make another element.
+    /// Packs the elements that came last into `group`, which may be null, and at the cursor, so
+    /// that a finished document takes little memory. The caller is about to make another element.
     /// Ignores: what somebody holds, and every call unless `packsFinished` is set.
     void packFinished(SVGElement* group);
 
-    /// Makes nodes again of all that is packed, and packs no more.
-    void stopPacking();
+    /// Makes nodes again of all that is packed in the document and in the open `group`, which may
+    /// be null, and packs no more. Throws: std::bad_alloc; the next call goes on then.
+    void stopPacking(SVGElement* group);
 
     /// Returns: the element that receives the next one, borrowed; null before there is a root.
     SVGElement* getCurrentNode() const { return currentNode.get(); }

@@ -3,6 +3,7 @@
 #include "draw/DrawmereImpl.h"
 #include "foundation/common/MoxUtil.h"
 #include "foundation/records/TLStringWithGlyphInfo.h"
+#include "state/SVGGroupManager.h"
 #include "tests/fonts/EmbeddedFont.h"
 #include "tests/support/AnyImage.h"
 #include "tests/support/TinyImages.h"
@@ -322,11 +323,17 @@ UnicodeString getOpenDefinition(const DrawmereImpl& impl) {
     return isInDocument ? node->getAttribute(MoxName(u"id")).toString() : UnicodeString();
 }
 
+void unpack(const DrawmereImpl& impl) {
+    const SVGGroupManager* page =
+        impl.savedGroupManager ? impl.savedGroupManager : impl.groupManager;
+    impl.treeManager->stopPacking(page->getGroupRootNode());
+}
+
 } // namespace
 
 void RandomCalls::makeCall(Drawmere& page) {
     if (unpacks) {
-        page.impl->treeManager->stopPacking();
+        unpack(*page.impl);
         page.impl->treeManager->packsFinished = ++unpackCount % 4 != 0;
     }
     const std::size_t idCount = ids.size();

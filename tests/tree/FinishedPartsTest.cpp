@@ -1,5 +1,6 @@
 // What is finished is packed, and nobody notices.
 #include "draw/DrawmereImpl.h"
+#include "state/SVGGroupManager.h"
 #include "tests/frontend/RunFiles.h"
 #include "tree/SVGTreeManager.h"
 
@@ -65,6 +66,15 @@ TEST_F(FinishedParts, AreNodesForWhoAsksForTheDocument) {
     drawRects(100);
     EXPECT_EQ(countNodes()[MoxCommonNS::MOXNODE_PACKED], 0);
     EXPECT_GT(countNodes()[MoxCommonNS::MOXNODE_ELEMENT], 100);
+}
+
+TEST_F(FinishedParts, AreNodesInTheOpenGroupToo) {
+    drawRects(100);
+    const MoxNode* const group = run.drawmere.impl->groupManager->getGroupRootNode();
+    ASSERT_EQ(group->lastLink()->previousLink()->kindLink(), MoxCommonNS::MOXNODE_PACKED);
+    run.drawmere.startPathData();
+    run.drawmere.impl->getDocument();
+    EXPECT_EQ(group->lastLink()->previousLink()->kindLink(), MoxCommonNS::MOXNODE_ELEMENT);
 }
 
 TEST_F(FinishedParts, LeaveLinksAndDestinationsToBeFound) {
