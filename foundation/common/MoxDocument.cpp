@@ -6,7 +6,10 @@ namespace MoxCommonNS {
 
 MoxDocument::MoxDocument() : MoxNode(MOXNODE_DOCUMENT, nullptr) { beginDocument(this); }
 
-MoxDocument::~MoxDocument() { endDocument(); }
+MoxDocument::~MoxDocument() {
+    endDocument();
+    MoxNodeHeap::stopReuse(); // all nodes go now
+}
 
 std::uint32_t MoxDocument::getTypeID() const { return typeId; }
 

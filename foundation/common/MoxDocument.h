@@ -20,10 +20,10 @@ public:
     /// Takes memory of trees.
     static void* operator new(std::size_t size) { return MoxNodeHeap::allocate(size); }
 
-    /// Gives the memory back, and that of nodes that were kept to be used again.
+    /// Gives the memory back.
     static void operator delete(void* document, std::size_t size) {
         MoxNodeHeap::release(document, size);
-        MoxNodeHeap::forgetReleased();
+        MoxNodeHeap::startReuse();
     }
 
     std::uint32_t getTypeID() const override;

@@ -70,7 +70,8 @@ struct Cutter {
     char* end = nullptr;
     MoxChunk* chunk = nullptr; // owned, as one of its users
     MoxChunkSource chunks;
-    MoxChunkSource wholeChunks;         // of packed nodes
+    MoxChunkSource wholeChunks; // of packed nodes
+    bool reuses = true;
     ReleasedBlocks* released = nullptr; // owned; not here, where a program has little room
 
     std::size_t room() const { return static_cast<std::size_t>(end - cursor); }
@@ -82,6 +83,9 @@ struct Cutter {
     void* takeReleased(std::size_t size) { return released ? released->take(size) : nullptr; }
 
     bool putReleased(void* block, std::size_t size) {
+        if (!reuses) {
+            return false;
+        }
         if (!released && chunk) { // a thread that cuts nothing keeps nothing
             released = new (std::nothrow) ReleasedBlocks;
         }
@@ -197,10 +201,13 @@ void MoxNodeHeap::release(void* block, std::size_t size) {
     cutter.letGo(block);
 }
 
-void MoxNodeHeap::forgetReleased() {
+void MoxNodeHeap::stopReuse() {
+    cutter.reuses = false;
     cutter.forgetReleased();
     cutter.wholeChunks.close();
 }
+
+void MoxNodeHeap::startReuse() { cutter.reuses = true; }
 
 char* MoxNodeHeap::allocateChunk() {
     if (MoxChunkMemory::isWatched) {

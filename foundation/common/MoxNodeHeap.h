@@ -21,9 +21,12 @@ public:
     /// Gives a block back. `size`: as allocated or grown to. Ignores: a null.
     static void release(void* block, std::size_t size);
 
-    /// Lets go of the blocks that this thread would use again, when a document is gone: they keep
-    /// their chunks.
-    static void forgetReleased();
+    /// Lets go of the blocks that this thread would use again, which keep their chunks, and keeps no
+    /// more until `startReuse`: a document goes.
+    static void stopReuse();
+
+    /// Uses released blocks again.
+    static void startReuse();
 
     /// Returns: memory of `MoxChunkSource::room` bytes, aligned to 8, for what is no node but lives
     /// as long. Throws: std::bad_alloc.

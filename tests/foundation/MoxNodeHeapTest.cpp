@@ -102,7 +102,8 @@ TEST(MoxNodeHeap, WhatIsAllReleasedIsCutAgainFromTheBeginning) {
     std::vector<Block> others = allocateMany(20);
     releaseAll(others);
     releaseAll(blocks);
-    MoxNodeHeap::forgetReleased();
+    MoxNodeHeap::stopReuse();
+    MoxNodeHeap::startReuse();
     void* second = MoxNodeHeap::allocate(16);
     if (cutsBlocks) {
         EXPECT_LE(reinterpret_cast<std::uintptr_t>(second),
@@ -124,7 +125,8 @@ TEST(MoxNodeHeap, AFewReleasedBlocksAreUsedAgain) {
     MoxNodeHeap::release(same, 88);
     MoxNodeHeap::release(other, 96);
     MoxNodeHeap::release(newest, 88);
-    MoxNodeHeap::forgetReleased();
+    MoxNodeHeap::stopReuse();
+    MoxNodeHeap::startReuse();
 }
 
 TEST(MoxNodeHeap, AWholeChunkCanBeWrittenTo) {
@@ -142,7 +144,8 @@ TEST(MoxNodeHeap, AWholeChunkCanBeWrittenTo) {
             MoxNodeHeap::releaseChunk(chunk);
         }
     }).join();
-    MoxNodeHeap::forgetReleased();
+    MoxNodeHeap::stopReuse();
+    MoxNodeHeap::startReuse();
 }
 
 TEST(MoxNodeHeap, ReleasingNothingDoesNothing) { MoxNodeHeap::release(nullptr, 0); }
