@@ -109,8 +109,10 @@ void Drawmere::initRootSvg(std::ostream* stream) {
 void Drawmere::openImpl() {
     closeImpl();
     impl = createImplInstance(config->svgType);
-    // Callers draw, and see the tree by `DrawmereImpl::getDocument` alone.
-    impl->treeManager->packsFinished = true;
+    // Callers draw, and see the tree by `DrawmereImpl::getDocument` alone. The passes of the
+    // small-device mode want all nodes in the end.
+    impl->treeManager->packsFinished =
+        config->svgType != SVGConfig::SVGTYPE_TINY || !config->wispMode;
     try {
         impl->initRootSvg();
     } catch (...) { // no memory

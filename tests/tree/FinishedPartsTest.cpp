@@ -77,6 +77,16 @@ TEST_F(FinishedParts, AreNodesInTheOpenGroupToo) {
     EXPECT_EQ(group->lastLink()->previousLink()->kindLink(), MoxCommonNS::MOXNODE_ELEMENT);
 }
 
+TEST_F(FinishedParts, StayNodesInTheSmallDeviceMode) {
+    run.config.svgType = SVGConfig::SVGTYPE_TINY;
+    run.config.wispMode = true;
+    run.open();
+    tree = run.drawmere.impl->treeManager;
+    drawRects(100);
+    run.drawmere.pushState();
+    EXPECT_GT(countNodes()[MoxCommonNS::MOXNODE_ELEMENT], 100);
+}
+
 TEST_F(FinishedParts, LeaveLinksAndDestinationsToBeFound) {
     drawRects(5);
     run.drawmere.startLink(u"#Mox", MoxName());
