@@ -181,6 +181,8 @@ public:
 
     /// Sends an element where it belongs: page content to the open group, and with `direct`, as
     /// containers need it, to the cursor of the tree, which moves into it with `makeCurrent`.
+    /// Owns: a reference. Who keeps a pointer to `element`, or wants its class to last, holds it in
+    /// a `MoxPtr`: what nobody else holds may be packed when it is finished.
     virtual void addElement(SVGElement* element, bool direct, bool makeCurrent);
 
     /// Makes the root element.

@@ -25,7 +25,8 @@ enum MoxNodeType : std::uint8_t {
 /// A pointer to a node that an operation returns is borrowed; who keeps it longer than the tree
 /// does holds it in a `MoxPtr`. No operation recurses by the depth of the tree.
 /// Finished parts of a tree may be packed (`MoxPackedNode`); whoever asks for relatives or for a
-/// walk gets nodes all the same.
+/// walk gets nodes all the same. To make them changes the tree, so one thread at a time reads a
+/// tree until `unpackAll`; saving changes nothing.
 class DRAWMERE_API MoxNode : public MoxNodeIterable {
 public:
     /// What `isA` and `getTypeID` know this class by.
