@@ -4,6 +4,7 @@
 #include "foundation/common/MoxChunkSource.h"
 #include "foundation/common/MoxNodeHeap.h"
 
+#include <algorithm>
 #include <cstddef>
 #include <cstdint>
 #include <cstdlib>
@@ -41,10 +42,13 @@ public:
     /// Returns: whether the memory is that of `reserveChunk`.
     bool hasChunk() const { return isChunk; }
 
+    /// Returns: whether `count` bytes more take no memory.
+    bool hasRoom(std::size_t count) const { return count <= capacity - length; }
+
     /// Makes room for `count` bytes more. Returns: where they go; `advance` takes them.
     /// Throws: std::bad_alloc, and nothing has changed.
     char* room(std::size_t count) {
-        if (count > capacity - length) {
+        if (!hasRoom(count)) {
             grow(count);
         }
         return memory + length;
@@ -67,8 +71,8 @@ public:
 
 private:
     void grow(std::size_t count) {
-        constexpr std::size_t first = 256;
-        std::size_t wanted = capacity == 0 ? first : 2 * capacity;
+        constexpr std::size_t second = 256; // many take nothing after the first bytes
+        std::size_t wanted = capacity == 0 ? count : std::max(second, 2 * capacity);
         while (wanted - length < count) {
             wanted *= 2;
         }

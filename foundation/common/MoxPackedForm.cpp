@@ -7,6 +7,7 @@
 #include "foundation/common/MoxPackedNode.h"
 #include "foundation/common/MoxText.h"
 
+#include <algorithm>
 #include <bit>
 #include <limits>
 
@@ -148,6 +149,16 @@ bool isKept(MoxName key, const MoxPackRules& rules) {
            !MoxNameTable::getEntry(key).isPlain;
 }
 
+/// Looks ahead where bytes would grow for an element that is kept: the row ends there, and it may
+/// be a short one.
+bool wouldGrowInVain(const MoxPackedBytes& out, std::size_t count,
+                     const MoxAttributeMap& attributes, const MoxPackRules& rules) {
+    return !out.hasRoom(count) &&
+           std::any_of(attributes.begin(), attributes.end(), [&rules](const MoxValue& attribute) {
+               return isKept(attribute.getKey(), rules);
+           });
+}
+
 bool appendElement(MoxPackedBytes& out, const MoxElement& element, const MoxPackRules& rules) {
     constexpr std::size_t headSize = 2 + sizeof(std::uint16_t);
     constexpr std::size_t keySize = sizeof(std::uint16_t);
@@ -157,6 +168,9 @@ bool appendElement(MoxPackedBytes& out, const MoxElement& element, const MoxPack
     const MoxAttributeMap attributes = element.attributeLinks();
     const auto count = static_cast<std::uint8_t>(attributes.getLength());
     const std::size_t allSmall = count * (keySize + smallSize);
+    if (wouldGrowInVain(out, headSize + allSmall, attributes, rules)) {
+        return false;
+    }
     char* end = out.room(headSize + allSmall);
     *end++ = static_cast<char>(findMark(element));
     *end++ = static_cast<char>(count);

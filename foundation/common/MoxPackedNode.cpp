@@ -88,14 +88,16 @@ bool MoxPackedNode::packLast(MoxNode& holder, const MoxPackRules& rules) {
         }
         return isPacked;
     }
+    MoxPackedBytes packed;
+    if (!MoxPacker::append(packed, *last, rules)) {
+        return false;
+    }
     const MoxPtr<MoxPackedNode> fresh(new MoxPackedNode(holder.getOwnerDocument()));
     fresh->placeInRow = tail ? tail->placeInRow + 1 : 0;
     if (fresh->placeInRow >= rowBeforeChunks) {
         fresh->bytes.reserveChunk();
     }
-    if (!MoxPacker::append(fresh->bytes, *last, rules)) {
-        return false;
-    }
+    fresh->bytes.append(packed.get());
     const MoxPtr<MoxNode> node(fresh);
     holder.replaceLink(*last, {&node, 1});
     return true;

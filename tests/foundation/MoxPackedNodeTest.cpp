@@ -6,6 +6,7 @@
 #include "foundation/common/MoxTreeIterator.h"
 
 #include <gtest/gtest.h>
+#include <malloc.h>
 #include <sstream>
 #include <string>
 
@@ -185,6 +186,17 @@ TEST_F(MoxPackedNodeTest, WhatConsistsOfManyNodesStaysAsItIs) {
         }
         EXPECT_EQ(packLast(), count == 30);
     }
+}
+
+TEST_F(MoxPackedNodeTest, AShortRowTakesLittleMemory) {
+    add(u"item")->setAttribute(MoxName(u"number"), MoxValue(1));
+    ASSERT_TRUE(packLast());
+    const auto* packed = static_cast<const MoxPackedNode*>(root->lastLink());
+    add(u"item")->setAttribute(MoxName(u"mark"), MoxValue(1));
+    EXPECT_FALSE(packLast());
+    // NOLINTNEXTLINE(cppcoreguidelines-pro-type-const-cast): as it came
+    auto* const memory = const_cast<char*>(packed->getBytes().data());
+    EXPECT_LT(malloc_usable_size(memory), 64U);
 }
 
 TEST_F(MoxPackedNodeTest, RelativesAreNodesAgain) {
