@@ -39,6 +39,9 @@ public:
 
     std::size_t size() const { return length; }
 
+    /// Returns: how many bytes there is memory for.
+    std::size_t getCapacity() const { return capacity; }
+
     /// Returns: whether the memory is that of `reserveChunk`.
     bool hasChunk() const { return isChunk; }
 
@@ -68,6 +71,17 @@ public:
 
     /// Lets go of what stands behind the first `count` bytes; memory stays.
     void cut(std::size_t count) { length = count; }
+
+    /// Gives memory back that nothing was appended to, but for a chunk.
+    void trim() {
+        if (isChunk || length == 0) {
+            return;
+        }
+        if (void* const shrunk = std::realloc(memory, length)) {
+            memory = static_cast<char*>(shrunk);
+            capacity = length;
+        }
+    }
 
 private:
     void grow(std::size_t count) {

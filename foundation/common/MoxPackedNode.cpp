@@ -3,17 +3,22 @@
 #include "foundation/common/MoxElement.h"
 #include "foundation/common/MoxText.h"
 
+#include <algorithm>
 #include <vector>
 
 namespace MoxCommonNS {
 namespace {
 
-/// A node with so many bytes takes no more: few elements are larger than what a chunk has left.
-constexpr std::size_t fullSize = MoxChunkSource::room - 1280;
 /// The first nodes of a row grow up to here, so that a short row takes little memory.
-constexpr std::size_t firstFullSize = 15360;
+constexpr std::size_t fullSize = 15360;
 /// From so many nodes in a row on they take a chunk each.
 constexpr int rowBeforeChunks = 8;
+/// Elements that are larger would leave much of a chunk unused.
+constexpr std::size_t largestInChunk = MoxChunkSource::room / 16;
+/// What a chunk has left for the next element, at least; and in parts of the largest one so far,
+/// which has asked for more while it was packed than it takes.
+constexpr std::size_t leastSpare = 1280;
+constexpr std::size_t sparesOfLargest = 3;
 
 MoxPackedNode* toPacked(MoxNode* node) {
     return node && node->kindLink() == MOXNODE_PACKED ? static_cast<MoxPackedNode*>(node) : nullptr;
@@ -82,8 +87,10 @@ bool MoxPackedNode::packLast(MoxNode& holder, const MoxPackRules& rules) {
     }
     MoxPackedNode* const tail = toPacked(last->previousLink());
     if (tail && !tail->isFull()) {
+        const std::size_t before = tail->bytes.size();
         const bool isPacked = MoxPacker::append(tail->bytes, *last, rules);
         if (isPacked) {
+            tail->noteElement(tail->bytes.size() - before);
             holder.removeChild(last);
         }
         return isPacked;
@@ -94,17 +101,29 @@ bool MoxPackedNode::packLast(MoxNode& holder, const MoxPackRules& rules) {
     }
     const MoxPtr<MoxPackedNode> fresh(new MoxPackedNode(holder.getOwnerDocument()));
     fresh->placeInRow = tail ? tail->placeInRow + 1 : 0;
-    if (fresh->placeInRow >= rowBeforeChunks) {
+    if (fresh->placeInRow >= rowBeforeChunks && packed.size() <= largestInChunk) {
         fresh->bytes.reserveChunk();
     }
     fresh->bytes.append(packed.get());
+    fresh->noteElement(packed.size());
     const MoxPtr<MoxNode> node(fresh);
     holder.replaceLink(*last, {&node, 1});
     return true;
 }
 
+/// Remembers the size of an element that came; a full node gives back what it has not used.
+void MoxPackedNode::noteElement(std::size_t size) {
+    largest = std::max(largest, size);
+    if (isFull()) {
+        bytes.trim();
+    }
+}
+
 bool MoxPackedNode::isFull() const {
-    return bytes.size() >= (bytes.hasChunk() ? fullSize : firstFullSize);
+    if (!bytes.hasChunk()) {
+        return bytes.size() >= fullSize;
+    }
+    return bytes.size() + std::max(leastSpare, sparesOfLargest * largest) >= MoxChunkSource::room;
 }
 
 void MoxPackedNode::unpack() {

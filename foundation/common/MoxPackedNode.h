@@ -29,14 +29,19 @@ public:
     /// Returns: what is packed, in the form of `MoxPackedForm.h`.
     std::string_view getBytes() const { return bytes.get(); }
 
+    /// Returns: the bytes of memory that stand behind them.
+    std::size_t getMemory() const { return bytes.getCapacity(); }
+
 protected:
     MoxPtr<MoxNode> cloneAlone() const override;
 
 private:
+    void noteElement(std::size_t size);
     bool isFull() const;
 
     MoxPackedBytes bytes;
-    int placeInRow = 0; // among packed siblings
+    std::size_t largest = 0; // of the packed elements, in bytes
+    int placeInRow = 0;      // among packed siblings
 };
 
 } // namespace MoxCommonNS

@@ -199,6 +199,28 @@ TEST_F(MoxPackedNodeTest, AShortRowTakesLittleMemory) {
     EXPECT_LT(malloc_usable_size(memory), 64U);
 }
 
+TEST_F(MoxPackedNodeTest, LargeElementsLeaveLittleMemoryUnused) {
+    for (const int length : {1000, 4000, 9000, 30000}) {
+        const MoxPtr<MoxElement> holder(add(u"item"));
+        add(u"first", holder.get());
+        for (int i = 0; i < 600000 / length; ++i) {
+            add(u"item", holder.get())
+                ->setAttribute(MoxName(u"text"), MoxValue(UnicodeString(length, u'x', length)));
+            MoxPackedNode::packLast(*holder, rules);
+        }
+        std::size_t used = 0;
+        std::size_t taken = 0;
+        for (const MoxNode* node = holder->firstLink()->nextLink(); node != holder->lastLink();
+             node = node->nextLink()) {
+            const auto& packed = static_cast<const MoxPackedNode&>(*node);
+            used += packed.getBytes().size();
+            taken += packed.getMemory();
+        }
+        EXPECT_GT(used, 500000U);
+        EXPECT_LT(taken, used + used / 5) << length;
+    }
+}
+
 TEST_F(MoxPackedNodeTest, RelativesAreNodesAgain) {
     for (int i = 0; i < 3; ++i) {
         add(u"item")->setAttribute(MoxName(u"number"), MoxValue(i));
