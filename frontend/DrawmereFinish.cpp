@@ -98,7 +98,12 @@ void Drawmere::saveDocument(MoxDocument* document, std::ostream* stream) {
         return;
     }
     SVGZipStream zip(*stream);
-    document->save(config->encoding, none, zip, nullptr, config->saveOption, none);
+    try {
+        document->save(config->encoding, none, zip, nullptr, config->saveOption, none);
+    } catch (...) { // no memory: without its end, nobody takes the file for a whole one
+        stream->setstate(std::ios::badbit);
+        throw;
+    }
     // What the document itself had to refuse is known to the outer stream alone.
     if (!zip.good() && stream->good()) {
         stream->setstate(std::ios::badbit);

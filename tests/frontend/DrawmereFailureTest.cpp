@@ -2,6 +2,7 @@
 #include "draw/DrawmereImpl.h"
 #include "foundation/common/MoxKeptText.h"
 #include "tests/frontend/RunFiles.h"
+#include "tests/support/Gunzip.h"
 #include "tree/SVGTreeManager.h"
 
 #include <gtest/gtest.h>
@@ -142,6 +143,25 @@ public:
 void loseText(Drawmere& drawmere) {
     drawmere.impl->treeManager->document->getDocumentElement()->setAttribute(
         MoxName(u"lost"), MoxValue::fromKept(new LostText));
+}
+
+class HugeText : public LostText {
+public:
+    bool handOut(std::string_view /*lineFeed*/, const Taker& take) const override {
+        take(std::string(100000, 'x'));
+        throw std::bad_alloc();
+    }
+};
+
+TEST(DrawmereFailure, ACompressedDocumentThatMemoryDoesNotSufficeForHasNoEnd) {
+    RunFiles run;
+    run.config.gzip = true;
+    run.open();
+    run.begin(1);
+    run.drawmere.impl->treeManager->document->getDocumentElement()->setAttribute(
+        MoxName(u"huge"), MoxValue::fromKept(new HugeText));
+    EXPECT_THROW(run.drawmere.finishRootSvg(), std::bad_alloc);
+    EXPECT_THROW(gunzip(run.directory.read("out1.svg")), std::runtime_error);
 }
 
 TEST(DrawmereFailure, ATextThatIsLostIsToldLikeAFullDisk) {
