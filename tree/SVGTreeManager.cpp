@@ -108,6 +108,9 @@ void SVGTreeManager::setRootAttributes(SVGElement& root, const UnicodeString& ve
 bool SVGTreeManager::canAdd() const { return unlocked && currentNode; }
 
 void SVGTreeManager::addElement(SVGElement* element, bool makeCurrent) {
+    if (makeCurrent) {
+        packFinished(nullptr); // the group that a container has closed
+    }
     if (!canAdd() || !element || !currentNode->appendChild(element)) {
         return;
     }

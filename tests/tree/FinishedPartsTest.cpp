@@ -111,6 +111,15 @@ TEST_F(FinishedParts, LeaveLinksAndDestinationsToBeFound) {
     EXPECT_EQ(destinations, 2); // the page and "here"
 }
 
+TEST_F(FinishedParts, AreBytesBetweenLinksToo) {
+    for (int i = 0; i < 50; ++i) {
+        drawRects(5);
+        run.drawmere.startLink(u"#Mox", MoxName());
+        run.drawmere.endLink();
+    }
+    EXPECT_LT(countNodes()[MoxCommonNS::MOXNODE_ELEMENT], 70); // the links and a little
+}
+
 TEST_F(FinishedParts, AreWhatTheyWereWhenTheyAreWritten) {
     drawRects(3);
     run.drawmere.setFillColor(MoxColor(1, 2, 3)); // of what comes, not of what is finished
