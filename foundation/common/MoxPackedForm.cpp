@@ -27,24 +27,16 @@ constexpr std::size_t maxCopied = 2048;
 /// could be. Without an end, parts that can't be packed would be walked for each of their parents.
 constexpr int maxNodes = 64;
 
-/// Returns: the end of what was written.
-char* writeFew(char* out, std::string_view text) {
-    *out++ = static_cast<char>(MoxPackedValue::shortText);
-    *out++ = static_cast<char>(text.size());
-    copyFewBytes(out, text.data(), text.size());
-    return out + text.size();
-}
-
-char* writeShort(char* out, std::string_view text) {
-    *out++ = static_cast<char>(MoxPackedValue::shortText);
-    *out++ = static_cast<char>(text.size());
-    std::memcpy(out, text.data(), text.size());
-    return out + text.size();
-}
-
 template <typename T> char* writeNumber(char* out, T number) {
     std::memcpy(out, &number, sizeof(number));
     return out + sizeof(number);
+}
+
+/// Writes the form of a text and its length. Returns: the end of what was written.
+char* writeHead(char* out, MoxPackedValue::Form form, std::size_t length) {
+    *out++ = static_cast<char>(form);
+    return form == MoxPackedValue::shortText ? writeNumber(out, static_cast<std::uint8_t>(length))
+                                             : writeNumber(out, static_cast<std::uint32_t>(length));
 }
 
 bool fitsIntoBits(const MoxValue& value) {
@@ -67,22 +59,20 @@ constexpr std::size_t smallSize = 2 + maxFewBytes;
         return nullptr;
     }
     const std::string_view text = value.getAsciiText();
-    return text.size() <= maxFewBytes ? writeFew(out, text) : nullptr;
-}
-
-char* writeLengths(char* out, std::uint8_t form, std::size_t length) {
-    *out++ = static_cast<char>(form);
-    const auto count = static_cast<std::uint32_t>(length);
-    std::memcpy(out, &count, sizeof(count));
-    return out + sizeof(count);
+    if (text.size() > maxFewBytes) {
+        return nullptr;
+    }
+    out = writeHead(out, MoxPackedValue::shortText, text.size());
+    copyFewBytes(out, text.data(), text.size());
+    return out + text.size();
 }
 
 /// Returns: the end of what was written, null for a text that is no list of numbers.
 char* writePairs(char* out, std::string_view text) {
-    char* const count = writeLengths(out, MoxPackedValue::pairText, text.size());
+    char* const count = writeHead(out, MoxPackedValue::pairText, text.size());
     char* const pairs = count + sizeof(std::uint32_t);
     const auto size = static_cast<std::uint32_t>(MoxDigitPairs::pack(text, pairs));
-    std::memcpy(count, &size, sizeof(size));
+    writeNumber(count, size);
     return size == 0 ? nullptr : pairs + size;
 }
 
@@ -93,10 +83,10 @@ bool appendAscii(MoxPackedBytes& out, std::string_view text) {
     }
     char* const place = out.room(maxHead + text.size());
     char* end = text.size() >= minPairs ? writePairs(place, text) : nullptr;
-    if (!end && text.size() <= maxShort) {
-        end = writeShort(place, text);
-    } else if (!end) {
-        end = writeLengths(place, MoxPackedValue::longText, text.size());
+    if (!end) {
+        const bool isShort = text.size() <= maxShort;
+        end = writeHead(place, isShort ? MoxPackedValue::shortText : MoxPackedValue::longText,
+                        text.size());
         std::memcpy(end, text.data(), text.size());
         end += text.size();
     }
@@ -111,7 +101,7 @@ bool appendWide(MoxPackedBytes& out, std::u16string_view text) {
     }
     const std::size_t size = text.size() * sizeof(char16_t);
     char* const place = out.room(maxHead + size);
-    char* const end = writeLengths(place, MoxPackedValue::wideText, text.size());
+    char* const end = writeHead(place, MoxPackedValue::wideText, text.size());
     std::memcpy(end, text.data(), size);
     out.advance(end + size);
     return true;

@@ -1,5 +1,4 @@
 // Writing characters, with references for those that can't stand as they are.
-#include "foundation/common/MoxFewBytes.h"
 #include "foundation/common/MoxKeptText.h"
 #include "foundation/common/MoxXmlChars.h"
 #include "foundation/common/MoxXmlScan.h"
@@ -40,16 +39,6 @@ constexpr std::array<std::uint8_t, 128> specialCharacters = [] {
     return marks;
 }();
 
-/// Short texts are the most, and they need no search.
-bool isShortAndPlain(std::string_view text) {
-#if defined(__SSE2__)
-    return text.size() >= 4 && text.size() <= maxFewBytes &&
-           isFreeOfXmlMarkup(text.data(), text.size());
-#else
-    return text.empty();
-#endif
-}
-
 bool isSpecial(char16_t c, bool inAttribute) {
     return (specialCharacters[c] & (inAttribute ? 2 : 1)) != 0;
 }
@@ -88,10 +77,6 @@ void MoxXmlWriter::writeText(const MoxValue& text, bool inAttribute) {
 }
 
 void MoxXmlWriter::writeAscii(std::string_view text, bool inAttribute) {
-    if (isShortAndPlain(text)) {
-        sink.write(text);
-        return;
-    }
     std::size_t start = 0;
     std::size_t i = findXmlMarkup(text, 0);
     while (i < text.size()) {

@@ -1,6 +1,6 @@
 #include "foundation/common/MoxKeptText.h"
 
-#include "foundation/common/MoxDocument.h"
+#include "tests/support/OneValueDocument.h"
 #include "tests/support/Utf8.h"
 
 #include <atomic>
@@ -12,6 +12,8 @@
 namespace {
 
 using namespace MoxCommonNS;
+using DrawmereTest::makeDocument;
+using DrawmereTest::saveWhole;
 using DrawmereTest::utf8;
 
 const MoxName href(u"href");
@@ -139,28 +141,15 @@ TEST(MoxKeptText, CopiesOfAValueShareItAndOutliveTheFirst) {
 
 // In documents.
 
-MoxPtr<MoxDocument> makeDocument(const MoxValue& value) {
-    MoxPtr<MoxDocument> document(new MoxDocument);
-    const MoxPtr<MoxElement> root = document->createElement(MoxName(u"svg"));
-    root->setAttribute(href, value);
-    document->appendChild(root.get());
-    return document;
-}
-
-std::string save(const MoxDocument& document, const char16_t* encoding = u"") {
-    std::ostringstream stream;
-    document.save(encoding, u"", stream, nullptr, u"", u"");
-    EXPECT_TRUE(stream.good());
-    return stream.str();
-}
-
 TEST(MoxKeptText, IsWrittenLikeTheWholeTextButNeverMade) {
     for (const char16_t* const encoding : {u"", u"UTF-16", u"US-ASCII", u"Shift_JIS"}) {
         for (const int count : {0, 1, 2, 70, 5000}) {
             const MoxPtr<Lines> lines(new Lines(count));
             const MoxValue whole = MoxValue::fromAscii(lines->write("\n"));
-            const MoxPtr<MoxDocument> document = makeDocument(MoxValue::fromKept(lines.get()));
-            EXPECT_EQ(save(*document, encoding), save(*makeDocument(whole), encoding));
+            const MoxPtr<MoxDocument> document =
+                makeDocument(href, MoxValue::fromKept(lines.get()));
+            EXPECT_EQ(saveWhole(*document, encoding),
+                      saveWhole(*makeDocument(href, whole), encoding));
             EXPECT_EQ(lines->readings, 1);
         }
     }
@@ -168,18 +157,18 @@ TEST(MoxKeptText, IsWrittenLikeTheWholeTextButNeverMade) {
 
 TEST(MoxKeptText, ACloneOfItsDocumentOutlivesTheDocument) {
     const MoxPtr<Lines> lines(new Lines(9));
-    MoxPtr<MoxDocument> document = makeDocument(MoxValue::fromKept(lines.get()));
+    MoxPtr<MoxDocument> document = makeDocument(href, MoxValue::fromKept(lines.get()));
     const MoxPtr<MoxNode> clone = document->cloneNode(/*deep=*/true);
-    const std::string saved = save(*document);
+    const std::string saved = saveWhole(*document);
     document = nullptr;
     EXPECT_EQ(lines->getReferenceCount(), 2);
-    EXPECT_EQ(save(static_cast<const MoxDocument&>(*clone)), saved);
+    EXPECT_EQ(saveWhole(static_cast<const MoxDocument&>(*clone)), saved);
 }
 
 TEST(MoxKeptText, WhatIsLostFailsTheStreamAndEndsTheDocument) {
     for (const int good : {0, 1, 4999}) {
         const MoxPtr<MoxDocument> document =
-            makeDocument(MoxValue::fromKept(new Lines(5000, good)));
+            makeDocument(href, MoxValue::fromKept(new Lines(5000, good)));
         std::ostringstream stream;
         document->save(u"", u"", stream, nullptr, u"", u"");
         EXPECT_TRUE(stream.bad());

@@ -1,8 +1,8 @@
 #include "images/SVGImageText.h"
 
-#include "foundation/common/MoxDocument.h"
 #include "images/SVGBase64.h"
 #include "tests/images/KeptImages.h"
+#include "tests/support/OneValueDocument.h"
 #include "tests/support/OpenFiles.h"
 #include "tests/support/TempDir.h"
 #include "tests/support/Utf8.h"
@@ -25,21 +25,6 @@ std::string encode(const std::string& bytes) {
     std::string text(SVGBase64::CalculateRecquiredEncodeOutputBufferSize(bytes.size()), '\0');
     SVGBase64::EncodeBuffer(bytes.data(), bytes.size(), text.data());
     return text.c_str();
-}
-
-MoxPtr<MoxDocument> makeDocument(const MoxValue& value) {
-    MoxPtr<MoxDocument> document(new MoxDocument);
-    const MoxPtr<MoxElement> root = document->createElement(MoxName(u"svg"));
-    root->setAttribute(href, value);
-    document->appendChild(root.get());
-    return document;
-}
-
-std::string save(const MoxDocument& document, const char16_t* encoding = u"") {
-    std::ostringstream stream;
-    document.save(encoding, u"", stream, nullptr, u"", u"");
-    EXPECT_TRUE(stream.good());
-    return stream.str();
 }
 
 MoxValue keepText(SVGImageStore& store, const std::string& bytes) {
@@ -71,10 +56,10 @@ TEST(SVGImageText, IsWrittenAsTheWholeTextWouldBe) {
             for (const std::size_t size : {std::size_t(0), std::size_t(57), piece + 1, chunk}) {
                 const std::string bytes = makeBytes(size);
                 const MoxValue whole = MoxValue::fromAscii("data:,\n" + encode(bytes));
-                const MoxPtr<MoxDocument> document = makeDocument(keepText(store, bytes));
-                const std::string saved = save(*document, encoding);
-                EXPECT_EQ(saved, save(*makeDocument(whole), encoding));
-                EXPECT_EQ(saved, save(*document, encoding)); // once more
+                const MoxPtr<MoxDocument> document = makeDocument(href, keepText(store, bytes));
+                const std::string saved = saveWhole(*document, encoding);
+                EXPECT_EQ(saved, saveWhole(*makeDocument(href, whole), encoding));
+                EXPECT_EQ(saved, saveWhole(*document, encoding)); // once more
             }
         }
     }
@@ -97,11 +82,13 @@ TEST(SVGImageText, DocumentsShareNoFile) {
                               SVGImageStore(0, directory.path())};
     const std::string one = makeBytes(chunk + 5);
     const std::string other = makeBytes(200);
-    const MoxPtr<MoxDocument> first = makeDocument(keepText(stores[0], one));
-    const MoxPtr<MoxDocument> second = makeDocument(keepText(stores[1], other));
+    const MoxPtr<MoxDocument> first = makeDocument(href, keepText(stores[0], one));
+    const MoxPtr<MoxDocument> second = makeDocument(href, keepText(stores[1], other));
     EXPECT_EQ(countOpenFiles(directory.path()), 2);
-    EXPECT_EQ(save(*first), save(*makeDocument(MoxValue::fromAscii("data:,\n" + encode(one)))));
-    EXPECT_EQ(save(*second), save(*makeDocument(MoxValue::fromAscii("data:,\n" + encode(other)))));
+    EXPECT_EQ(saveWhole(*first),
+              saveWhole(*makeDocument(href, MoxValue::fromAscii("data:,\n" + encode(one)))));
+    EXPECT_EQ(saveWhole(*second),
+              saveWhole(*makeDocument(href, MoxValue::fromAscii("data:,\n" + encode(other)))));
 }
 
 TEST(SVGImageText, ACloneKeepsTheFileOpen) {
@@ -109,12 +96,12 @@ TEST(SVGImageText, ACloneKeepsTheFileOpen) {
     MoxPtr<MoxDocument> document;
     {
         SVGImageStore store(0, directory.path());
-        document = makeDocument(keepText(store, makeBytes(1000)));
+        document = makeDocument(href, keepText(store, makeBytes(1000)));
     }
-    const std::string saved = save(*document);
+    const std::string saved = saveWhole(*document);
     MoxPtr<MoxNode> clone = document->cloneNode(/*deep=*/true);
     document = nullptr;
-    EXPECT_EQ(save(static_cast<const MoxDocument&>(*clone)), saved);
+    EXPECT_EQ(saveWhole(static_cast<const MoxDocument&>(*clone)), saved);
     EXPECT_EQ(countOpenFiles(directory.path()), 1);
     clone = nullptr;
     EXPECT_EQ(countOpenFiles(directory.path()), 0);
@@ -123,7 +110,7 @@ TEST(SVGImageText, ACloneKeepsTheFileOpen) {
 TEST(SVGImageText, BytesThatAreGoneFailTheStream) {
     const TempDir directory;
     SVGImageStore store(0, directory.path());
-    const MoxPtr<MoxDocument> document = makeDocument(keepText(store, makeBytes(chunk)));
+    const MoxPtr<MoxDocument> document = makeDocument(href, keepText(store, makeBytes(chunk)));
     cutOpenFiles(directory.path(), chunk - 1);
     std::ostringstream stream;
     document->save(u"", u"", stream, nullptr, u"", u"");
